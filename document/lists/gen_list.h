@@ -1,0 +1,24 @@
+#pragma once
+
+#include "document/export.h"
+#include "platform/framework/list.h"
+
+// The base of a document's record lists. A list owns its records, which DeleteAll and RemoveEmptyLines
+// delete; its destructor does not, so its owner calls DeleteAll first. List order is the order on screen and
+// on file.
+class KOTA0_AD_API CGenList : public CObList {
+public:
+    CGenList();
+    ~CGenList() override;
+
+    // Adds the list's section to a file that is being built.
+    virtual void Save(void* file) = 0;
+    // Adds what the list's section holds at the tail; a missing section or keyword adds nothing. The handle
+    // is that of the target, or of the section around.
+    virtual void Load(void* targetOrSection) = 0;
+    // Removes and deletes all records.
+    virtual void DeleteAll() = 0;
+    // Removes and deletes the records that are not filled in far enough to mean anything, and sets `*changed`
+    // to 1 if there were any. Always 1.
+    virtual int RemoveEmptyLines(int* changed) = 0;
+};

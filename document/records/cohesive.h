@@ -1,0 +1,41 @@
+#pragma once
+
+#include "document/records/comp_river_pos.h"
+
+// How a critical shear is given.
+enum class ShearMode { Stress = 0, Velocity = 1 };
+
+// The cohesive sediment parameters of a component, everywhere or at one place of a river.
+class KOTA0_AD_API AD_Global_Const : public AD_Comp_RiverPos {
+public:
+    AD_Global_Const(); // global
+    ~AD_Global_Const() override;
+
+    // Adds the record's six keywords to the open section, which is the record's own.
+    void Save(void* file) override;
+    // Reads them from the record's section, each by its name.
+    void Load(void* section) override;
+
+    double cOffset = 10.0;
+    double g = 4.5;
+    double m = 0.0;
+    double w0 = 0.005;
+    double swi = 0.000392;
+    double timeCentering = 0.8;
+    double critShearDep = 0.05;
+    int instantErosion = 1; // not 0: layer 1 erodes at once
+    double critShearEro1 = 0.07;
+    double critShearEro2 = 0.3;
+    double critShearEro3 = 0.3;
+    double eroCoef1 = 0.2;
+    double eroCoef2 = 0.2;
+    double eroCoef3 = 0.2;
+    double eroExp1 = 3.0;
+    double eroExp2 = 3.0;
+    double eroExp3 = 3.0;
+    double tran12 = 2.85;
+    double tran23 = 0.15;
+    double slidFrCoef = 5.0;
+    int depShearMode = 0; // a ShearMode, of critShearDep
+    int eroShearMode = 0; // a ShearMode, of critShearEro1 to 3
+};

@@ -1,0 +1,21 @@
+#include "platform/framework/screen.h"
+
+#include <utility>
+
+namespace kota {
+
+namespace {
+Screen* theScreen = nullptr;
+} // namespace
+
+Screen::Screen() = default;
+Screen::~Screen() = default;
+
+Screen* attachScreen(Screen* screen) {
+    return std::exchange(theScreen, screen);
+}
+Screen* attachedScreen() {
+    return theScreen;
+}
+
+} // namespace kota

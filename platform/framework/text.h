@@ -1,0 +1,56 @@
+#pragma once
+
+#include "platform/framework/export.h"
+
+#include <iosfwd>
+#include <string>
+#include <string_view>
+
+// A text of 8-bit characters, UTF-8 by convention and never checked: any bytes may stand in it, NUL
+// included. A value: copies share nothing. Nothing that allocates is inline, so that a text made in one
+// library may be changed and destroyed in another.
+class KOTA_API CString {
+public:
+    CString();
+    // A null pointer gives the empty text.
+    CString(const char* text); // NOLINT(google-explicit-constructor): a literal is a text
+    explicit CString(std::string_view text);
+    CString(const CString& other);
+    CString(CString&& other) noexcept;
+    ~CString();
+
+    CString& operator=(const CString& other);
+    CString& operator=(CString&& other) noexcept;
+    CString& operator=(const char* text);
+    CString& operator=(std::string_view text);
+
+    // Length in bytes.
+    int GetLength() const;
+    bool IsEmpty() const;
+    void Empty();
+
+    // The bytes, ended by a NUL, valid until the text changes.
+    operator const char*() const; // NOLINT(google-explicit-constructor): the framework's manner
+    std::string_view View() const;
+
+    CString& operator+=(const CString& tail);
+    CString& operator+=(const char* tail);
+    CString& operator+=(char tail);
+
+    // Below 0, 0 or above 0, by unsigned bytes.
+    int Compare(const CString& other) const;
+
+    // Replaces the text by `format` filled in as the C library's printf does.
+    [[gnu::format(printf, 2, 3)]] void Format(const char* format, ...);
+
+private:
+    std::string text_;
+};
+
+KOTA_API bool operator==(const CString& left, const CString& right);
+KOTA_API bool operator==(const CString& left, const char* right);
+KOTA_API bool operator<(const CString& left, const CString& right);
+KOTA_API CString operator+(const CString& left, const CString& right);
+KOTA_API CString operator+(const CString& left, const char* right);
+KOTA_API CString operator+(const char* left, const CString& right);
+KOTA_API std::ostream& operator<<(std::ostream& stream, const CString& text);

@@ -1,0 +1,46 @@
+#pragma once
+
+#include "exchange/packages/packages.h"
+#include "platform/framework/window.h"
+
+#include <functional>
+#include <optional>
+#include <vector>
+
+namespace kota::headless {
+
+// One message of an editor to the shell, with what its package held at the time.
+struct Received {
+    UINT message = 0; // as registered
+    WPARAM code = 0;
+    bool hasPackage = false;
+    CView* sender = nullptr; // may be gone by now
+    CString documentName;
+    std::int32_t packageKind = 0;
+    std::intptr_t project = 0;
+    CObject* items = nullptr; // the sender's; may be gone by now
+};
+
+// The main window of a shell: answers the editors' requests from a project given to it, and records what
+// they send.
+class MainWindow : public CWnd {
+public:
+    // The handle that code 25 is answered with; 0 means that no project is open.
+    void openProject(std::intptr_t project) { project_ = project; }
+
+    // Every message of the two registered names so far, in their order.
+    const std::vector<Received>& received() const { return received_; }
+    // Those of one code.
+    std::vector<Received> received(WPARAM code) const;
+
+    // Called with each message before it is answered, so that a test can call back into the editor from it.
+    std::function<void(const Received&)> onMessage;
+
+    LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
+
+private:
+    std::intptr_t project_ = 0;
+    std::vector<Received> received_;
+};
+
+} // namespace kota::headless

@@ -1,0 +1,61 @@
+#pragma once
+
+#include <cstddef>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace kota::kvs {
+
+// Builds the text of a file, element by element, in memory.
+//
+// A call that the form has no place for (a section outside a target, a parameter without a keyword, a brace
+// too deep) adds nothing and is told by misuse().
+class Writer {
+public:
+    // Closes what is open and begins a target.
+    void addTarget(std::string_view name);
+    void addSection(std::string_view name);
+    // Closes the section, or the target, that was opened last.
+    void endSection();
+    // Begins a keyword in the open section; parameters added next belong to it.
+    void addKeyword(std::string_view name);
+    void addInt(int value);
+    void addDouble(double value);
+    void addBool(bool value);
+    void addString(std::string_view value);
+
+    // Closes whatever is still open and gives the whole text in pieces, which stay the writer's.
+    const std::vector<std::string_view>& finish();
+    // What the first misplaced call was; empty when there was none.
+    const std::string& misuse() const { return misuse_; }
+
+private:
+    // `length` bytes to write into, at the end of the text; what was written is kept by naming its end.
+    char* room(std::size_t length);
+    void keep(char* end);
+
+    void append(std::string_view text);
+    void beginLine();
+    void endLine();
+    bool beginParameter();
+    void open(std::string_view word, std::string_view name);
+    void appendName(std::string_view name);
+    void appendQuoted(std::string_view text);
+    void misplaced(std::string_view element, std::string_view name);
+
+    struct Piece {
+        std::unique_ptr<char[]> bytes;
+        std::size_t size;
+        std::size_t used;
+    };
+    std::vector<Piece> pieces_;
+    std::vector<std::string_view> text_;
+    std::string misuse_;
+    int depth_ = 0;
+    bool lineOpen_ = false;
+    enum class Keyword { None, Empty, Filled } keyword_ = Keyword::None; // the one that takes parameters
+};
+
+} // namespace kota::kvs

@@ -1,0 +1,10 @@
+#pragma once
+
+#include "platform/framework/types.h"
+
+// The numbers of the plug-in's resources, each named once.
+namespace StringId {
+inline constexpr UINT SedimentGlobalsMissing = 4838;    // %s: the component's name
+inline constexpr UINT NonCohesiveGlobalsMissing = 4839; // %s: the component's name
+inline constexpr UINT UnsupportedFileFormat = 4840;
+} // namespace StringId

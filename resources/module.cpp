@@ -1,0 +1,8 @@
+#include "resources/module.h"
+
+#include "resources/strings.h"
+
+const kota::Module& kota0AdModule() {
+    static const kota::Module module("Kota0_ad", englishStrings());
+    return module;
+}
