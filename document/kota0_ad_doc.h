@@ -71,7 +71,7 @@ protected:
     CString WrittenPathName(const char* path) const override;
 
 private:
-    template<std::size_t Count>
+    template <std::size_t Count>
     using Lists = std::array<CGenList*, Count>;
     Lists<12> AllLists();
     Lists<10> SavedLists();

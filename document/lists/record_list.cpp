@@ -50,13 +50,13 @@ bool isIncomplete(const AD_ST_Init_Cond_data& record) {
 
 } // namespace
 
-template<class Record>
+template <class Record>
 RecordList<Record>::RecordList(const char* section) : section_(section) {}
 
-template<class Record>
+template <class Record>
 RecordList<Record>::~RecordList() = default;
 
-template<class Record>
+template <class Record>
 void RecordList<Record>::Save(void* file) {
     kvsAddSection(file, section_);
     for (POSITION position = GetHeadPosition(); position;)
@@ -64,12 +64,12 @@ void RecordList<Record>::Save(void* file) {
     kvsEndSection(file);
 }
 
-template<class Record>
+template <class Record>
 void RecordList<Record>::Load(void* targetOrSection) {
     LoadKeywords(kvsSectionByNameNum(targetOrSection, section_, 1));
 }
 
-template<class Record>
+template <class Record>
 void RecordList<Record>::LoadKeywords(void* section) {
     void* keyword = kvsKeywordByNameNum(section, dataKeyword, 1);
     for (int n = 2; keyword; ++n) {
@@ -80,13 +80,13 @@ void RecordList<Record>::LoadKeywords(void* section) {
     }
 }
 
-template<class Record>
+template <class Record>
 void RecordList<Record>::DeleteAll() {
     while (!IsEmpty())
         delete RemoveTail();
 }
 
-template<class Record>
+template <class Record>
 int RecordList<Record>::RemoveEmptyLines(int* changed) {
     for (POSITION position = GetHeadPosition(); position;) {
         const POSITION at = position;

@@ -4,7 +4,7 @@
 
 // A list of one class of records, in a section of its own with a keyword a record. Compiled in the plug-in
 // alone, for the record classes of the document.
-template<class Record>
+template <class Record>
 class KOTA0_AD_API RecordList : public CGenList {
 public:
     ~RecordList() override;

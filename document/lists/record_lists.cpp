@@ -53,7 +53,7 @@ constexpr int notWritten = -1; // a record's componentNum
 
 // A component that first occurs in the last record is not examined, and the name that is told is that of the
 // last record's component, not of the one that lacks its global line: both are how the check is meant.
-template<class Record>
+template <class Record>
 int checkGlobalsPresent(const RecordList<Record>& list, const CCompList* components, int kindFilter,
                         UINT message) {
     CList<int, int> seen;

@@ -6,7 +6,7 @@ namespace {
 
 using Record = AD_Global_Const;
 
-template<class Form>
+template <class Form>
 struct Keyword {
     const char* name;
     Form form;

@@ -103,14 +103,14 @@ constexpr Key keys[] = {
 static_assert(std::size(keys) == 55);
 
 // A keyword of a fixed number of parameters, one for each element of an array member.
-template<class Element, std::size_t Count>
+template <class Element, std::size_t Count>
 struct ArrayKey {
     const char* name;
     Element (Vars::*member)[Count];
     Element byDefault;
 };
 
-template<class Element, std::size_t Count>
+template <class Element, std::size_t Count>
 constexpr ArrayKey<Element, Count> arrayKey(const char* name, Element (Vars::*member)[Count],
                                             Element byDefault) {
     return {name, member, byDefault};
@@ -134,19 +134,19 @@ constexpr auto dispersionKeys = std::tuple(arrayKey("G_disp_factor", &Vars::K32_
                                            arrayKey("G_max_disp_coef", &Vars::K32_max_disp_coef, 100.0));
 
 // One letter for each element: "iiii" or "dd".
-template<class Element, std::size_t Count>
+template <class Element, std::size_t Count>
 constexpr auto formatOf(const ArrayKey<Element, Count>&) {
     std::array<char, Count + 1> format{};
     std::fill_n(format.begin(), Count, std::is_same_v<Element, int> ? 'i' : 'd');
     return format;
 }
 
-template<class Keys>
+template <class Keys>
 void setDefaults(Vars& vars, const Keys& arrayKeys) {
     std::apply([&](auto... key) { (std::ranges::fill(vars.*key.member, key.byDefault), ...); }, arrayKeys);
 }
 
-template<class Keys>
+template <class Keys>
 void saveSection(void* file, const char* section, Vars& vars, const Keys& arrayKeys) {
     const auto save = [&](const auto& key) {
         const auto put = [&](auto... value) {
@@ -159,7 +159,7 @@ void saveSection(void* file, const char* section, Vars& vars, const Keys& arrayK
     kvsEndSection(file);
 }
 
-template<class Keys>
+template <class Keys>
 void loadSection(void* parent, const char* name, Vars& vars, const Keys& arrayKeys) {
     void* const section = kvsSectionByNameNum(parent, name, 1);
     if (!section)

@@ -13,7 +13,7 @@
 namespace kota {
 
 // An int that is a bool on file.
-template<class Record>
+template <class Record>
 struct BoolParameter {
     int Record::*member;
 };
@@ -22,12 +22,12 @@ struct BoolParameter {
 // SaveLocation.
 struct LocationTriple {};
 
-template<class... Entry>
+template <class... Entry>
 constexpr auto fileForm(Entry... entries) {
     return std::tuple(entries...);
 }
 
-template<class Record>
+template <class Record>
 constexpr BoolParameter<Record> asBool(int Record::*member) {
     return {member};
 }
@@ -37,23 +37,23 @@ class ParameterWriter {
 public:
     explicit ParameterWriter(void* file) : file_(file) {}
 
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, int Base::*member) const {
         kvsAddInt(file_, record.*member);
     }
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, double Base::*member) const {
         kvsAddDouble(file_, record.*member);
     }
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, CString Base::*member) const {
         kvsAddString(file_, (record.*member).View());
     }
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, BoolParameter<Base> flag) const {
         kvsAddBool(file_, record.*flag.member != 0);
     }
-    template<class Record>
+    template <class Record>
     void operator()(Record& record, LocationTriple) const {
         record.SaveLocation(file_);
     }
@@ -67,25 +67,25 @@ class ParameterReader {
 public:
     explicit ParameterReader(void* keyword) : keyword_(keyword) {}
 
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, int Base::*member) {
         record.*member = kvsGetInt(next());
     }
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, double Base::*member) {
         record.*member = kvsGetDouble(next());
     }
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, CString Base::*member) {
         record.*member = kvsGetString(next());
     }
-    template<class Record, class Base>
+    template <class Record, class Base>
     void operator()(Record& record, BoolParameter<Base> flag) {
         record.*flag.member = kvsGetBool(next()) ? 1 : 0;
     }
 
     // A global record has no place, whatever stands there.
-    template<class Record>
+    template <class Record>
     void operator()(Record& record, LocationTriple) {
         (*this)(record, asBool(&Record::isGlobal));
         if (record.isGlobal) {
@@ -105,14 +105,14 @@ private:
 };
 
 // Starts a keyword with the record's parameters.
-template<class Record, class Form>
+template <class Record, class Form>
 void saveKeyword(void* file, const char* name, Record& record, const Form& form) {
     kvsAddKeyword(file, name);
     std::apply([&](auto... entry) { (ParameterWriter(file)(record, entry), ...); }, form);
 }
 
 // Reads the record's parameters; one that the keyword lacks reads as zero or empty.
-template<class Record, class Form>
+template <class Record, class Form>
 void loadKeyword(void* keyword, Record& record, const Form& form) {
     ParameterReader read(keyword);
     std::apply([&](auto... entry) { (read(record, entry), ...); }, form);

@@ -2,83 +2,86 @@
 
 #include "platform/framework/exception.h"
 
-#include <memory>
+#include <new>
+#include <type_traits>
+#include <utility>
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 struct CList<Type, Argument>::Node : kota::ListNode {
     Type value{};
 };
 
-// Nodes allocated together. All blocks are freed when the list becomes empty.
-template<class Type, class Argument>
+// Nodes allocated together, behind this head. All blocks are freed when the list becomes empty.
+template <class Type, class Argument>
 struct CList<Type, Argument>::Block {
     Block* older;
-    std::unique_ptr<Node[]> nodes;
+
+    Node* nodes() { return reinterpret_cast<Node*>(this + 1); }
 };
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 CList<Type, Argument>::CList(int blockSize) : blockSize_(blockSize > 0 ? blockSize : 1) {}
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 CList<Type, Argument>::~CList() {
     RemoveAll();
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 int CList<Type, Argument>::GetCount() const {
     return count_;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 bool CList<Type, Argument>::IsEmpty() const {
     return count_ == 0;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::GetHeadPosition() const {
     return head_;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::GetTailPosition() const {
     return tail_;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 Type CList<Type, Argument>::GetHead() const {
     return Checked(head_, "GetHead")->value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 Type CList<Type, Argument>::GetTail() const {
     return Checked(tail_, "GetTail")->value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 Type CList<Type, Argument>::GetAt(POSITION position) const {
     return Checked(position, "GetAt")->value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 void CList<Type, Argument>::SetAt(POSITION position, Argument value) {
     Checked(position, "SetAt")->value = value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 Type CList<Type, Argument>::GetNext(POSITION& position) const {
     const Node* node = Checked(position, "GetNext");
     position = node->next;
     return node->value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 Type CList<Type, Argument>::GetPrev(POSITION& position) const {
     const Node* node = Checked(position, "GetPrev");
     position = node->previous;
     return node->value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::Find(Argument value, POSITION after) const {
     POSITION position = after ? Checked(after, "Find")->next : head_;
     while (position && static_cast<Node*>(position)->value != value)
@@ -86,7 +89,7 @@ POSITION CList<Type, Argument>::Find(Argument value, POSITION after) const {
     return position;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::FindIndex(int index) const {
     if (index < 0 || index >= count_)
         return nullptr;
@@ -96,57 +99,55 @@ POSITION CList<Type, Argument>::FindIndex(int index) const {
     return position;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::AddHead(Argument value) {
     return InsertBetween(nullptr, head_, value);
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::AddTail(Argument value) {
     return InsertBetween(tail_, nullptr, value);
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::InsertBefore(POSITION position, Argument value) {
     return InsertBetween(Checked(position, "InsertBefore")->previous, position, value);
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::InsertAfter(POSITION position, Argument value) {
     return InsertBetween(position, Checked(position, "InsertAfter")->next, value);
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 Type CList<Type, Argument>::RemoveHead() {
     const Type value = GetHead();
     Unlink(head_);
     return value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 Type CList<Type, Argument>::RemoveTail() {
     const Type value = GetTail();
     Unlink(tail_);
     return value;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 void CList<Type, Argument>::RemoveAt(POSITION position) {
     Unlink(Checked(position, "RemoveAt"));
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 void CList<Type, Argument>::RemoveAll() {
     head_ = tail_ = free_ = nullptr;
     count_ = 0;
-    while (blocks_) {
-        const std::unique_ptr<Block> block(blocks_);
-        blocks_ = block->older;
-    }
+    while (blocks_)
+        ::operator delete(std::exchange(blocks_, blocks_->older));
 }
 
 // A node that is in the list is what its neighbour, or the list's head, points at.
-template<class Type, class Argument>
+template <class Type, class Argument>
 typename CList<Type, Argument>::Node* CList<Type, Argument>::Checked(POSITION position,
                                                                      const char* operation) const {
     if (!position || (position->previous ? position->previous->next : head_) != position)
@@ -154,16 +155,10 @@ typename CList<Type, Argument>::Node* CList<Type, Argument>::Checked(POSITION po
     return static_cast<Node*>(position);
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
 POSITION CList<Type, Argument>::InsertBetween(POSITION previous, POSITION next, Argument value) {
-    if (!free_) {
-        auto block = std::make_unique<Block>(Block{blocks_, std::make_unique<Node[]>(blockSize_)});
-        for (int i = blockSize_ - 1; i >= 0; --i) {
-            block->nodes[i].next = free_;
-            free_ = &block->nodes[i];
-        }
-        blocks_ = block.release();
-    }
+    if (!free_)
+        AddBlock();
     Node* node = static_cast<Node*>(free_);
     free_ = node->next;
     node->value = value;
@@ -175,7 +170,19 @@ POSITION CList<Type, Argument>::InsertBetween(POSITION previous, POSITION next, 
     return node;
 }
 
-template<class Type, class Argument>
+template <class Type, class Argument>
+void CList<Type, Argument>::AddBlock() {
+    static_assert(std::is_trivially_destructible_v<Node> && sizeof(Block) % alignof(Node) == 0);
+    void* const room = ::operator new(sizeof(Block) + blockSize_ * sizeof(Node));
+    blocks_ = new (room) Block{blocks_};
+    for (int i = blockSize_ - 1; i >= 0; --i) {
+        Node* node = new (blocks_->nodes() + i) Node;
+        node->next = free_;
+        free_ = node;
+    }
+}
+
+template <class Type, class Argument>
 void CList<Type, Argument>::Unlink(POSITION position) {
     if (--count_ == 0) {
         RemoveAll();

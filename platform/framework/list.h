@@ -21,7 +21,7 @@ using POSITION = kota::ListNode*;
 // A null position raises the invalid-argument failure in every operation that takes one, and so does a
 // position whose neighbours show that it is no longer, or never was, in this list. Taking from an empty
 // list raises it too.
-template<class Type, class Argument>
+template <class Type, class Argument>
 class KOTA_API CList : public CObject {
 public:
     explicit CList(int blockSize = 10);
@@ -59,6 +59,7 @@ private:
 
     Node* Checked(POSITION position, const char* operation) const;
     POSITION InsertBetween(POSITION previous, POSITION next, Argument value);
+    void AddBlock();
     void Unlink(POSITION position);
 
     POSITION head_ = nullptr;

@@ -1,62 +1,123 @@
 #include "platform/framework/text.h"
 
+#include <algorithm>
+#include <atomic>
 #include <cstdarg>
+#include <cstdint>
 #include <cstdio>
+#include <cstring>
+#include <new>
 #include <ostream>
+#include <stdexcept>
+#include <string>
+#include <utility>
 
-CString::CString() = default;
-CString::CString(const char* text) : text_(text ? text : "") {}
-CString::CString(std::string_view text) : text_(text) {}
-CString::CString(const CString& other) = default;
-CString::CString(CString&& other) noexcept = default;
-CString::~CString() = default;
+// The bytes of a text, ended by a NUL, in one piece behind this head.
+struct CString::Bytes {
+    std::atomic<std::uint32_t> users;
+    std::uint32_t length;
+    std::uint32_t capacity;
 
-CString& CString::operator=(const CString& other) = default;
-CString& CString::operator=(CString&& other) noexcept = default;
+    char* text() { return reinterpret_cast<char*>(this + 1); }
 
-CString& CString::operator=(const char* text) {
-    text_ = text ? text : "";
+    static Bytes* make(std::string_view text, std::size_t capacity) {
+        if (capacity >= UINT32_MAX)
+            throw std::length_error("a text of more than 4 GiB");
+        void* const room = ::operator new(sizeof(Bytes) + capacity + 1);
+        auto* bytes = new (room) Bytes{1, 0, static_cast<std::uint32_t>(capacity)};
+        bytes->append(text);
+        return bytes;
+    }
+
+    // Within the capacity.
+    void append(std::string_view tail) {
+        std::memmove(text() + length, tail.data(), tail.size());
+        length += static_cast<std::uint32_t>(tail.size());
+        text()[length] = '\0';
+    }
+
+    static Bytes* share(Bytes* bytes) {
+        if (bytes)
+            bytes->users.fetch_add(1, std::memory_order_relaxed);
+        return bytes;
+    }
+};
+
+CString::CString(const char* text) : CString(std::string_view(text ? text : "")) {}
+CString::CString(std::string_view text) : bytes_(text.empty() ? nullptr : Bytes::make(text, text.size())) {}
+CString::CString(const CString& other) : bytes_(Bytes::share(other.bytes_)) {}
+
+void CString::Release(Bytes* bytes) {
+    if (!bytes || bytes->users.fetch_sub(1, std::memory_order_acq_rel) > 1)
+        return;
+    bytes->~Bytes();
+    ::operator delete(bytes);
+}
+
+CString& CString::operator=(const CString& other) {
+    Release(std::exchange(bytes_, Bytes::share(other.bytes_)));
     return *this;
 }
 
-CString& CString::operator=(std::string_view text) {
-    text_ = text;
+CString& CString::operator=(CString&& other) noexcept {
+    std::swap(bytes_, other.bytes_);
     return *this;
+}
+
+CString& CString::operator=(const char* text) {
+    return *this = CString(text);
+}
+CString& CString::operator=(std::string_view text) {
+    return *this = CString(text);
 }
 
 int CString::GetLength() const {
-    return static_cast<int>(text_.size());
+    return bytes_ ? static_cast<int>(bytes_->length) : 0;
 }
 bool CString::IsEmpty() const {
-    return text_.empty();
+    return GetLength() == 0;
 }
 void CString::Empty() {
-    text_.clear();
+    *this = CString();
 }
 CString::operator const char*() const {
-    return text_.c_str();
+    return bytes_ ? bytes_->text() : "";
 }
 std::string_view CString::View() const {
-    return text_;
+    return bytes_ ? std::string_view(bytes_->text(), bytes_->length) : std::string_view();
 }
 
 CString& CString::operator+=(const CString& tail) {
-    text_ += tail.text_;
+    Append(tail.View());
     return *this;
 }
 
 CString& CString::operator+=(const char* tail) {
-    text_ += tail ? tail : "";
+    Append(tail ? tail : "");
     return *this;
 }
 
 CString& CString::operator+=(char tail) {
-    text_ += tail;
+    Append({&tail, 1});
     return *this;
 }
 
+void CString::Append(std::string_view tail) {
+    const std::size_t length = View().size() + tail.size();
+    const bool inPlace =
+        bytes_ && bytes_->users.load(std::memory_order_acquire) == 1 && length <= bytes_->capacity;
+    if (!inPlace) {
+        // `tail` may be a part of this text, so the old bytes stay until it is appended.
+        Bytes* const grown = Bytes::make(View(), std::max(length, View().size() * 2));
+        grown->append(tail);
+        Release(std::exchange(bytes_, grown));
+    } else {
+        bytes_->append(tail);
+    }
+}
+
 int CString::Compare(const CString& other) const {
-    return text_.compare(other.text_);
+    return View().compare(other.View());
 }
 
 void CString::Format(const char* format, ...) {
@@ -70,7 +131,7 @@ void CString::Format(const char* format, ...) {
     std::string filled(length > 0 ? static_cast<std::size_t>(length) : 0, '\0');
     std::vsnprintf(filled.data(), filled.size() + 1, format, again);
     va_end(again);
-    text_ = std::move(filled);
+    *this = std::string_view(filled);
 }
 
 bool operator==(const CString& left, const CString& right) {

@@ -2,22 +2,25 @@
 
 #include "platform/framework/export.h"
 
+#include <cstddef>
 #include <iosfwd>
-#include <string>
 #include <string_view>
 
 // A text of 8-bit characters, UTF-8 by convention and never checked: any bytes may stand in it, NUL
-// included. A value: copies share nothing. Nothing that allocates is inline, so that a text made in one
-// library may be changed and destroyed in another.
+// included. A value: copies share their bytes until one of them is changed. Nothing that allocates is inline,
+// so that a text made in one library may be changed and destroyed in another.
 class KOTA_API CString {
 public:
-    CString();
+    CString() noexcept {}
     // A null pointer gives the empty text.
     CString(const char* text); // NOLINT(google-explicit-constructor): a literal is a text
     explicit CString(std::string_view text);
     CString(const CString& other);
-    CString(CString&& other) noexcept;
-    ~CString();
+    CString(CString&& other) noexcept : bytes_(other.bytes_) { other.bytes_ = nullptr; }
+    ~CString() {
+        if (bytes_)
+            Release(bytes_);
+    }
 
     CString& operator=(const CString& other);
     CString& operator=(CString&& other) noexcept;
@@ -44,7 +47,12 @@ public:
     [[gnu::format(printf, 2, 3)]] void Format(const char* format, ...);
 
 private:
-    std::string text_;
+    struct Bytes;
+
+    static void Release(Bytes* bytes);
+    void Append(std::string_view tail);
+
+    Bytes* bytes_ = nullptr; // shared with the copies; null for the empty text
 };
 
 KOTA_API bool operator==(const CString& left, const CString& right);

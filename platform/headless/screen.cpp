@@ -7,7 +7,7 @@ namespace kota::headless {
 
 namespace {
 
-template<class Answer>
+template <class Answer>
 std::optional<Answer> takeFirst(std::deque<Answer>& answers) {
     if (answers.empty())
         return std::nullopt;

@@ -1,68 +1,62 @@
 #pragma once
 
+#include "platform/framework/text.h"
+
+#include <bit>
 #include <cstdint>
-#include <cstring>
-#include <string_view>
+#include <limits>
 
 namespace kota::kvs {
 
 // One element of a file's values: a parameter, or the head of a keyword, behind which its parameters stand.
-// Twelve bytes, since a big file is millions of these and little else.
+//
+// Eight bytes, since a big file is millions of these and little else. A double stands for itself; every other
+// type stands in the bits of a NaN that no double of a file has: its type in the 16 bits on top, its value in
+// the 48 below.
 class Cell {
 public:
-    enum class Type : std::uint32_t { Keyword, Int, Double, Bool, String };
+    enum class Type : std::uint16_t { Double = 0, Int = 0xFFF9, Bool = 0xFFFA, String = 0xFFFB };
 
-    static constexpr std::uint32_t longestString = (1u << 29) - 1;
-
-    // The head of a keyword with no parameters yet, in a group of the name index.
-    static Cell keyword(std::uint32_t group);
-    static Cell ofInt(std::int32_t value);
-    static Cell ofDouble(double value);
-    static Cell ofBool(bool value);
-    // `value` is not copied; it is longestString bytes at the most.
-    static Cell ofString(std::string_view value);
-
-    Type type() const { return static_cast<Type>(typeAndLength_ & ((1u << typeBits) - 1)); }
+    // The head of a keyword of a group of the name index. It has no type.
+    static Cell keyword(std::uint32_t group) { return Cell(group); }
+    static Cell ofInt(std::int32_t value) { return boxed(Type::Int, static_cast<std::uint32_t>(value)); }
+    static Cell ofBool(bool value) { return boxed(Type::Bool, value ? 1 : 0); }
+    static Cell ofDouble(double value) {
+        const bool isNan = value != value;
+        return Cell(std::bit_cast<std::uint64_t>(isNan ? std::numeric_limits<double>::quiet_NaN() : value));
+    }
+    // `value` must outlive the cell.
+    static Cell ofString(const CString& value) {
+        return boxed(Type::String, std::bit_cast<std::uintptr_t>(&value));
+    }
 
     // Of a keyword's head alone.
-    std::uint32_t group() const { return payload<Head>().group; }
-    std::uint32_t parameterCount() const { return payload<Head>().parameterCount; }
-    void countParameter();
+    std::uint32_t group() const { return static_cast<std::uint32_t>(bits_); }
+    std::uint32_t parameterCount() const { return static_cast<std::uint32_t>(bits_ >> 32); }
+    void setParameterCount(std::uint32_t count) { bits_ = std::uint64_t{count} << 32 | group(); }
 
+    // Of a parameter alone.
+    Type type() const {
+        const auto top = static_cast<std::uint16_t>(bits_ >> valueBits);
+        return top >= static_cast<std::uint16_t>(Type::Int) ? Type{top} : Type::Double;
+    }
     // The parameter's natural value as another type, and zero, false or "" where there is none.
     std::int32_t asInt() const;
     double asDouble() const;
     bool asBool() const;
-    std::string_view asString() const;
+    const CString& asString() const;
 
 private:
-    struct Head {
-        std::uint32_t group;
-        std::uint32_t parameterCount;
-    };
+    static constexpr int valueBits = 48;
 
-    template<class Value>
-    Cell(Type type, std::uint32_t length, Value value)
-        : typeAndLength_(length << typeBits | static_cast<std::uint32_t>(type)), payload_{} {
-        static_assert(sizeof(Value) <= sizeof(payload_));
-        std::memcpy(payload_, &value, sizeof value);
+    explicit Cell(std::uint64_t bits) : bits_(bits) {}
+    static Cell boxed(Type type, std::uint64_t value) {
+        return Cell(static_cast<std::uint64_t>(type) << valueBits | value);
     }
 
-    template<class Value>
-    Value payload() const {
-        Value value;
-        std::memcpy(&value, payload_, sizeof value);
-        return value;
-    }
+    std::uint64_t value() const { return bits_ & ((std::uint64_t{1} << valueBits) - 1); }
 
-    static constexpr int typeBits = 3;
-
-    std::uint32_t length() const { return typeAndLength_ >> typeBits; }
-
-    std::uint32_t typeAndLength_; // the length is a string's
-    unsigned char payload_[8];
+    std::uint64_t bits_;
 };
-
-static_assert(sizeof(Cell) == 12);
 
 } // namespace kota::kvs

@@ -34,12 +34,12 @@ std::string_view textOf(const char* name) {
 
 LoadError load(const std::string& path, std::optional<kota::kvs::Tree>& tree) {
     try {
-        auto [bytes, length, error] = kota::kvs::loadText(path.c_str());
-        if (!error.empty())
+        kota::kvs::InputFile input;
+        if (const std::string error = input.open(path.c_str()); !error.empty())
             return {0, 0, error};
-        tree.emplace(std::move(bytes), length);
-        kota::kvs::readText(*tree);
-        return {};
+        tree.emplace(input.size());
+        kota::kvs::readText([&](char* to, std::size_t room) { return input.read(to, room); }, *tree);
+        return {0, 0, input.error()};
     } catch (const kota::kvs::SyntaxError& syntax) {
         const std::string place = std::to_string(syntax.line) + ":" + std::to_string(syntax.column);
         return {syntax.line, syntax.column, path + ":" + place + ": " + syntax.what()};
@@ -120,8 +120,9 @@ bool kvsGetBool(void* parameter) {
     return parameter && static_cast<const Cell*>(parameter)->asBool();
 }
 
-std::string_view kvsGetString(void* parameter) {
-    return parameter ? static_cast<const Cell*>(parameter)->asString() : std::string_view();
+const CString& kvsGetString(void* parameter) {
+    static const CString none;
+    return parameter ? static_cast<const Cell*>(parameter)->asString() : none;
 }
 
 namespace kota::kvs {

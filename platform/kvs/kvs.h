@@ -67,11 +67,11 @@ KOTA_API void* kvsParamByNum(void* keyword, int place);
 
 // A parameter's value. A parameter of another type gives its natural value: an int as a double, a bool as 0
 // or 1, a number equal to 0 or 1 as a bool, a double truncated to an int where it is in range; otherwise
-// zero, false or an empty string. The string's bytes stay the file's.
+// zero, false or an empty string. The string stays the file's.
 KOTA_API int kvsGetInt(void* parameter);
 KOTA_API double kvsGetDouble(void* parameter);
 KOTA_API bool kvsGetBool(void* parameter);
-KOTA_API std::string_view kvsGetString(void* parameter);
+KOTA_API const CString& kvsGetString(void* parameter);
 
 namespace kota::kvs {
 // What kvsGetListParam does, for a list of addresses made beforehand.
@@ -85,7 +85,7 @@ KOTA_API void putListParam(void* file, const char* keyword, std::string_view for
 // Fills the addresses, one for each letter of `format` ("i" an int*, "d" a double*), from the keyword's
 // parameters in their order. An address whose parameter is missing, or that does not fit its letter, stays as
 // it was. Gives how many were filled.
-template<class... Address>
+template <class... Address>
 int kvsGetListParam(void* section, const char* keyword, int number, const char* format,
                     Address... addresses) {
     const kota::kvs::Destination destinations[] = {addresses...};
@@ -112,7 +112,7 @@ KOTA_API void kvsAddBool(void* file, bool value);
 KOTA_API void kvsAddString(void* file, std::string_view value);
 
 // Starts the keyword and appends its parameters, one value for each letter of `format`.
-template<class... Value>
+template <class... Value>
 void kvsPutListParam(void* file, const char* keyword, const char* format, Value... values) {
     const kota::kvs::Source sources[] = {values...};
     kota::kvs::putListParam(file, keyword, format, sources);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <array>
 #include <string>
 #include <string_view>
 
@@ -23,12 +24,29 @@ constexpr bool isNameCharacter(char c) {
     return isNameStart(c) || isDigit(c) || c == '.' || c == '-';
 }
 
+inline constexpr auto nameCharacters = [] {
+    std::array<bool, 256> table{};
+    for (int c = 0; c < 256; ++c)
+        table[c] = isNameCharacter(static_cast<char>(c));
+    return table;
+}();
+
 // Whether a name may stand without quotes.
 constexpr bool isPlainName(std::string_view name) {
     if (name.empty() || !isNameStart(name.front()))
         return false;
     for (const char c : name)
-        if (!isNameCharacter(c))
+        if (!nameCharacters[static_cast<unsigned char>(c)])
+            return false;
+    return true;
+}
+
+// Whether two names are the same. They are short, and mostly the same: no call is worth it.
+constexpr bool sameName(std::string_view left, std::string_view right) {
+    if (left.size() != right.size())
+        return false;
+    for (std::size_t i = 0; i < left.size(); ++i)
+        if (left[i] != right[i])
             return false;
     return true;
 }

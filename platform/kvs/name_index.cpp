@@ -5,17 +5,15 @@
 namespace kota::kvs {
 
 NameIndex::Group NameIndex::count(Family family, std::string_view name) {
-    // Most elements bear the name of the one before.
-    if (last_ == none || !names_[last_].is(family, name)) {
+    if (find(family, name) == none) {
         if (names_.size() * 2 >= slots_.size())
             grow();
-        Group& slot = slots_[slotOf(family, name)];
-        if (slot == none) {
-            slot = static_cast<Group>(names_.size());
-            names_.push_back({name.data(), static_cast<std::uint32_t>(name.size()), family});
-            ends_.push_back(0);
-        }
-        last_ = slot;
+        last_ = static_cast<Group>(names_.size());
+        slots_[slotOf(family, name)] = last_;
+        names_.push_back(
+            {static_cast<std::uint32_t>(text_.size()), static_cast<std::uint32_t>(name.size()), family});
+        text_.insert(text_.end(), name.begin(), name.end());
+        ends_.push_back(0);
     }
     ++ends_[last_];
     return last_;
@@ -28,9 +26,7 @@ void NameIndex::place(Group group, std::uint32_t element) {
 }
 
 std::span<const std::uint32_t> NameIndex::elements(Family family, std::string_view name) const {
-    if (slots_.empty())
-        return {};
-    const Group group = slots_[slotOf(family, name)];
+    const Group group = find(family, name);
     if (group == none)
         return {};
     // Each group ends where the next begins.
@@ -38,10 +34,21 @@ std::span<const std::uint32_t> NameIndex::elements(Family family, std::string_vi
     return std::span(places_).subspan(begin, ends_[group] - begin);
 }
 
+NameIndex::Group NameIndex::find(Family family, std::string_view name) const {
+    if (last_ != none && is(last_, family, name))
+        return last_;
+    if (slots_.empty())
+        return none;
+    const Group found = slots_[slotOf(family, name)];
+    if (found != none)
+        last_ = found;
+    return found;
+}
+
 std::size_t NameIndex::slotOf(Family family, std::string_view name) const {
     const std::size_t mask = slots_.size() - 1;
     std::size_t slot = (std::hash<std::string_view>()(name) + family * 0x9E3779B97F4A7C15u) & mask;
-    while (slots_[slot] != none && !names_[slots_[slot]].is(family, name))
+    while (slots_[slot] != none && !is(slots_[slot], family, name))
         slot = (slot + 1) & mask;
     return slot;
 }
@@ -49,7 +56,7 @@ std::size_t NameIndex::slotOf(Family family, std::string_view name) const {
 void NameIndex::grow() {
     slots_.assign(slots_.empty() ? 64 : slots_.size() * 4, none);
     for (Group group = 0; group < names_.size(); ++group)
-        slots_[slotOf(names_[group].family, {names_[group].text, names_[group].length})] = group;
+        slots_[slotOf(names_[group].family, textOf(names_[group]))] = group;
 }
 
 void NameIndex::startPlacing() {

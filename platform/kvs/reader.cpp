@@ -5,7 +5,6 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
-#include <iterator>
 #include <limits>
 #include <utility>
 
@@ -13,16 +12,35 @@ namespace kota::kvs {
 
 namespace {
 
-constexpr bool isBlank(char c) {
-    return c == ' ' || c == '\t' || c == '\r';
-}
+// What a character may be, in one look.
+enum CharacterClass : unsigned char {
+    Blank = 1,
+    NameStart = 2,
+    NameCharacter = 4,
+    BehindValue = 8, // what a value must be followed by
+    EndsPlain = 16,  // what ends a run of a string's characters that stand for themselves
+};
 
-constexpr auto nameCharacters = [] {
-    std::array<bool, 256> table{};
-    for (int c = 0; c < 256; ++c)
-        table[c] = isNameCharacter(static_cast<char>(c));
-    return table;
+constexpr auto characterClasses = [] {
+    std::array<unsigned char, 256> classes{};
+    const auto add = [&](std::string_view characters, int kind) {
+        for (const char c : characters)
+            classes[static_cast<unsigned char>(c)] |= static_cast<unsigned char>(kind);
+    };
+    for (int c = 0; c < 256; ++c) {
+        const auto character = static_cast<char>(c);
+        if (isNameCharacter(character))
+            add({&character, 1}, isNameStart(character) ? NameStart | NameCharacter : NameCharacter);
+    }
+    add(" \t\r", Blank);
+    add(std::string_view(" \t\r,}\n#\0", 8), BehindValue); // NUL: the end of the text, or an error
+    add(std::string_view("\"\\\n\0", 4), EndsPlain);
+    return classes;
 }();
+
+constexpr bool is(char c, CharacterClass kind) {
+    return (characterClasses[static_cast<unsigned char>(c)] & kind) != 0;
+}
 
 constexpr int hexDigit(char c) {
     if (isDigit(c))
@@ -34,18 +52,22 @@ constexpr int hexDigit(char c) {
     return -1;
 }
 
+// Those that a double holds exactly.
+constexpr std::array powersOfTen = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
+                                    1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
+
 constexpr const char* aValue = "a value (a number, true, false, nan, inf, -inf or a string in double quotes)";
 
-// One pass over the text, front to back. A NUL stands behind its end, so that one character may always be
-// looked at.
+// One pass over the text, front to back, with one line of it in memory: no word, value or string goes over a
+// line's end. A NUL stands behind the text, so that one character may always be looked at.
 class Reader {
 public:
-    explicit Reader(Tree& tree)
-        : tree_(tree), begin_(tree.text()), end_(begin_ + tree.textLength()), at_(begin_) {}
+    Reader(const ByteSource& source, Tree& tree) : tree_(tree), buffer_(source) { nextLine(buffer_.end()); }
 
     void read();
 
 private:
+    void nextLine(const char* at);
     void skipBlanks();
     void skipSpace();
     bool atEnd() const { return at_ == end_; }
@@ -58,28 +80,32 @@ private:
 
     void readTarget();
     void readMember();
-    void open(std::string_view name);
+    void open(const std::string& name);
     void readKeyword(std::string_view name);
-    Cell value();
+    void readParameter();
     Cell number();
+    Cell longNumber(const char* start);
     Cell wordValue();
     void endOfValue();
 
-    [[noreturn]] void fail(const std::string& expected) { fail(expected, at_); }
+    [[noreturn]] void fail(const std::string& expected) const { fail(expected, at_); }
     [[noreturn]] void fail(const std::string& expected, const char* where) const;
     std::string found(const char* where) const;
 
     Tree& tree_;
-    const char* const begin_;
-    const char* const end_;
-    const char* at_;
+    LineBuffer buffer_;
+    const char* at_ = nullptr;
+    const char* end_ = nullptr;
+    const char* lineStart_ = nullptr;
+    int line_ = 0;
+    std::string decoded_; // the last string that had escapes
     std::array<Tree::SectionId, deepestNesting + 1> open_{Tree::file};
     int depth_ = 0;
 };
 
 void Reader::read() {
-    if (std::string_view(begin_, end_).starts_with(byteOrderMark))
-        at_ += byteOrderMark.size();
+    if (std::string_view(at_, end_).starts_with(byteOrderMark))
+        lineStart_ = at_ += byteOrderMark.size();
     for (skipSpace(); !atEnd(); skipSpace()) {
         if (*at_ == '}' && depth_ > 0) {
             --depth_;
@@ -99,7 +125,7 @@ void Reader::readTarget() {
     if (word() != targetWord)
         fail("'target'", start);
     skipSpace();
-    open(name("the target's name"));
+    open(std::string(name("the target's name")));
 }
 
 // A section or, below a target's own level, a keyword. A word that '=' follows is always a keyword's name.
@@ -111,7 +137,7 @@ void Reader::readMember() {
     skipBlanks();
     if (plain && first == sectionWord && *at_ != '=') {
         skipSpace();
-        open(name("the section's name"));
+        open(std::string(name("the section's name")));
     } else if (inTarget) {
         fail("'section' or '}'", start);
     } else {
@@ -119,7 +145,8 @@ void Reader::readMember() {
     }
 }
 
-void Reader::open(std::string_view name) {
+// The name is a copy, since the brace may stand on a later line.
+void Reader::open(const std::string& name) {
     skipSpace();
     if (*at_ != '{')
         fail("'{'");
@@ -139,7 +166,7 @@ void Reader::readKeyword(std::string_view name) {
     if (atLineEnd() || *at_ == '}')
         return;
     for (;;) {
-        tree_.addParameter(value());
+        readParameter();
         skipBlanks();
         if (*at_ != ',')
             break;
@@ -150,17 +177,11 @@ void Reader::readKeyword(std::string_view name) {
         fail("',' or the end of the line");
 }
 
-Cell Reader::value() {
-    if (*at_ == '"') {
-        const char* start = at_;
-        const std::string_view text = quoted();
-        if (text.size() > Cell::longestString)
-            fail("a string of at most " + std::to_string(Cell::longestString) + " bytes", start);
-        return Cell::ofString(text);
-    }
-    if (isNameStart(*at_))
-        return wordValue();
-    return number();
+void Reader::readParameter() {
+    if (*at_ == '"')
+        tree_.addString(quoted());
+    else
+        tree_.addParameter(is(*at_, NameStart) ? wordValue() : number());
 }
 
 Cell Reader::wordValue() {
@@ -181,7 +202,7 @@ Cell Reader::number() {
     const bool negative = *at_ == '-';
     if (negative)
         ++at_;
-    if (negative && isNameStart(*at_)) {
+    if (negative && is(*at_, NameStart)) {
         if (word() == "inf")
             return Cell::ofDouble(-std::numeric_limits<double>::infinity());
         fail(aValue, start);
@@ -189,16 +210,42 @@ Cell Reader::number() {
     if (!isDigit(*at_) && *at_ != '.')
         fail(aValue, start);
 
-    std::int64_t magnitude = 0;
-    for (; isDigit(*at_) && magnitude <= std::numeric_limits<std::int32_t>::max(); ++at_)
-        magnitude = magnitude * 10 + (*at_ - '0');
-    const std::int64_t integer = negative ? -magnitude : magnitude;
-    const bool endsHere = !isDigit(*at_) && *at_ != '.' && *at_ != 'e' && *at_ != 'E';
-    if (endsHere && std::in_range<std::int32_t>(integer)) {
-        endOfValue();
-        return Cell::ofInt(static_cast<std::int32_t>(integer));
-    }
+    // The digits as one whole number, which is right for up to 19 of them and exact in a double up to 2^53.
+    constexpr std::size_t mostDigits = 19;
+    constexpr std::uint64_t mostExact = std::uint64_t{1} << 53;
+    std::uint64_t digits = 0;
+    const char* at = at_;
+    const auto readDigits = [&] {
+        const char* const first = at;
+        for (; isDigit(*at); ++at)
+            digits = digits * 10 + (*at - '0');
+        return static_cast<std::size_t>(at - first);
+    };
+    const std::size_t whole = readDigits();
+    const bool hasPoint = *at == '.';
+    if (hasPoint)
+        ++at;
+    const std::size_t decimals = hasPoint ? readDigits() : 0;
+    const std::size_t count = whole + decimals;
+    const bool exact = count > 0 && count <= mostDigits && digits <= mostExact;
+    if (!exact || *at == 'e' || *at == 'E')
+        return longNumber(start);
 
+    at_ = at;
+    endOfValue();
+    if (hasPoint) {
+        // Both are exact, so their quotient is the double nearest to what is written.
+        const double value = static_cast<double>(digits) / powersOfTen[decimals];
+        return Cell::ofDouble(negative ? -value : value);
+    }
+    const std::int64_t integer =
+        negative ? -static_cast<std::int64_t>(digits) : static_cast<std::int64_t>(digits);
+    return std::in_range<std::int32_t>(integer) ? Cell::ofInt(static_cast<std::int32_t>(integer))
+                                                : longNumber(start);
+}
+
+// A number of many digits, or with an exponent, or one that is none.
+Cell Reader::longNumber(const char* start) {
     double value = 0;
     const auto [stop, error] = std::from_chars(start, end_, value);
     if (error == std::errc::invalid_argument)
@@ -214,13 +261,23 @@ Cell Reader::number() {
 
 // What a number must be followed by, so that "1x" is not read as 1 and something else.
 void Reader::endOfValue() {
-    if (!isBlank(*at_) && *at_ != ',' && *at_ != '}' && !atLineEnd())
+    if (!is(*at_, BehindValue) || (*at_ == '\0' && !atEnd()))
         fail("',' or the end of the line");
 }
 
+void Reader::nextLine(const char* at) {
+    lineStart_ = at_ = buffer_.loadLine(at);
+    end_ = buffer_.end();
+    ++line_;
+}
+
+// Loops over characters go on a pointer of their own: what a character holds might be a part of `at_` for all
+// that the compiler knows, and then `at_` is stored at each step.
 void Reader::skipBlanks() {
-    while (isBlank(*at_))
-        ++at_;
+    const char* at = at_;
+    while (is(*at, Blank))
+        ++at;
+    at_ = at;
 }
 
 void Reader::skipSpace() {
@@ -228,20 +285,19 @@ void Reader::skipSpace() {
         skipBlanks();
         if (*at_ == '#')
             at_ = std::find(at_, end_, '\n');
-        else if (*at_ == '\n')
-            ++at_;
-        else
+        if (*at_ != '\n')
             return;
+        nextLine(at_ + 1);
     }
 }
 
 std::string_view Reader::word() {
-    const char* start = at_;
-    if (isNameStart(*at_))
+    const char* at = at_;
+    if (is(*at, NameStart))
         do
-            ++at_;
-        while (nameCharacters[static_cast<unsigned char>(*at_)]);
-    return {start, at_};
+            ++at;
+        while (is(*at, NameCharacter));
+    return {std::exchange(at_, at), at};
 }
 
 std::string_view Reader::name(const char* expected) {
@@ -253,24 +309,26 @@ std::string_view Reader::name(const char* expected) {
     return plain;
 }
 
-// The string that begins here, without its quotes. It ends on the line on which it begins.
+// The string that begins here, without its quotes. It ends on the line on which it begins; the view is good
+// until the next string, or the next line, is read.
 std::string_view Reader::quoted() {
-    const char* start = ++at_;
-    while (*at_ != '"' && *at_ != '\\' && *at_ != '\n' && !atEnd())
+    const char* const start = at_ + 1;
+    const char* at = start;
+    while (!is(*at, EndsPlain))
+        ++at;
+    at_ = at;
+    if (*at == '"') {
         ++at_;
-    if (*at_ == '"')
-        return {start, at_++};
-    const std::string_view plain(start, at_);
-    char* decoded = tree_.roomForDecoded();
-    char* to = std::ranges::copy(plain, decoded).out;
+        return {start, at};
+    }
+    decoded_.assign(start, at);
     while (*at_ != '"') {
         if (*at_ == '\n' || atEnd())
             fail("'\"' to close the string");
-        *to++ = *at_ == '\\' ? escape() : *at_++;
+        decoded_ += *at_ == '\\' ? escape() : *at_++;
     }
     ++at_;
-    tree_.keepDecoded(to);
-    return {decoded, to};
+    return decoded_;
 }
 
 char Reader::escape() {
@@ -301,15 +359,10 @@ char Reader::escape() {
 }
 
 void Reader::fail(const std::string& expected, const char* where) const {
-    const char* lineStart =
-        std::find(std::reverse_iterator(where), std::reverse_iterator(begin_), '\n').base();
-    const auto line = 1 + std::count(begin_, lineStart, '\n');
-    if (lineStart == begin_ && std::string_view(begin_, end_).starts_with(byteOrderMark))
-        lineStart += byteOrderMark.size();
     int column = 1;
-    for (const char* c = lineStart; c < where; c += std::max(1, utf8Length({c, where})))
+    for (const char* c = lineStart_; c < where; c += std::max(1, utf8Length({c, where})))
         ++column;
-    throw SyntaxError(static_cast<int>(line), column, "expected " + expected + ", found " + found(where));
+    throw SyntaxError(line_, column, "expected " + expected + ", found " + found(where));
 }
 
 // What stands at a place: a whole word or number, or else one character.
@@ -338,8 +391,8 @@ std::string Reader::found(const char* where) const {
 
 } // namespace
 
-void readText(Tree& tree) {
-    Reader(tree).read();
+void readText(const ByteSource& source, Tree& tree) {
+    Reader(source, tree).read();
     tree.finish();
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/kvs/line_buffer.h"
 #include "platform/kvs/tree.h"
 
 #include <stdexcept>
@@ -16,7 +17,7 @@ struct SyntaxError : std::runtime_error {
     int column; // in characters
 };
 
-// Reads the text that `tree` was given and builds the tree from it. Throws SyntaxError.
-void readText(Tree& tree);
+// Reads a text and builds the tree from it, up to where it can be found in. Throws SyntaxError.
+void readText(const ByteSource& source, Tree& tree);
 
 } // namespace kota::kvs

@@ -62,35 +62,32 @@ bool replaceWhole(const fs::path& path, std::span<const std::string_view> pieces
 
 } // namespace
 
-LoadedText loadText(const char* path) {
-    LoadedText loaded;
+std::string InputFile::open(const char* path) {
+    path_ = path;
     std::error_code failed;
     const fs::file_status status = fs::status(path, failed);
-    if (!fs::exists(status)) {
-        loaded.error = reasonFor(path, failed ? failed.message() : std::generic_category().message(ENOENT));
-        return loaded;
-    }
-    if (!fs::is_regular_file(status)) {
-        loaded.error = reasonFor(path, "not a file");
-        return loaded;
-    }
-    const OpenFile file(std::fopen(path, "rb"));
-    if (!file) {
-        loaded.error = reasonFor(path, errno);
-        return loaded;
-    }
+    if (fs::exists(status) && !fs::is_regular_file(status))
+        return reasonFor(path, "not a file");
+    file_.reset(std::fopen(path, "rb"));
+    if (!file_)
+        return reasonFor(path, errno);
     const std::uintmax_t size = fs::file_size(path, failed);
-    if (failed || size > largestFile) {
-        loaded.error = reasonFor(path, failed ? failed.message() : "larger than 4 GiB");
-        return loaded;
-    }
-    std::setvbuf(file.get(), nullptr, _IONBF, 0);
-    loaded.bytes = std::make_unique_for_overwrite<char[]>(size + 1);
-    loaded.length = std::fread(loaded.bytes.get(), 1, size, file.get());
-    loaded.bytes[loaded.length] = '\0';
-    if (loaded.length < size && std::ferror(file.get()))
-        loaded.error = reasonFor(path, errno);
-    return loaded;
+    if (failed || size > largestFile)
+        return reasonFor(path, failed ? failed.message() : "larger than 4 GiB");
+    size_ = size;
+    std::setvbuf(file_.get(), nullptr, _IONBF, 0);
+    return {};
+}
+
+std::size_t InputFile::read(char* to, std::size_t room) {
+    const std::size_t length = std::fread(to, 1, room, file_.get());
+    if (length < room && std::ferror(file_.get()))
+        error_ = errno;
+    return length;
+}
+
+std::string InputFile::error() const {
+    return error_ == 0 ? std::string() : reasonFor(path_, error_);
 }
 
 std::string appendText(const char* path, std::span<const std::string_view> pieces) {

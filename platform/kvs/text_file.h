@@ -1,5 +1,7 @@
 #pragma once
 
+#include <cstddef>
+#include <cstdio>
 #include <memory>
 #include <span>
 #include <string>
@@ -7,15 +9,27 @@
 
 namespace kota::kvs {
 
-// A file's bytes, or why they could not be read.
-struct LoadedText {
-    std::unique_ptr<char[]> bytes; // `length` of them, and a NUL; null when `error` is not empty
-    std::size_t length = 0;
-    std::string error;
-};
+// A regular file that is read from the front to the back.
+class InputFile {
+public:
+    // Gives why the file cannot be read, or an empty text.
+    std::string open(const char* path);
+    std::size_t size() const { return size_; }
+    // The next bytes, at most `room` of them. How many; 0 at the end, and when reading fails.
+    std::size_t read(char* to, std::size_t room);
+    // Why reading failed, or an empty text.
+    std::string error() const;
 
-// Reads a regular file whole.
-LoadedText loadText(const char* path);
+private:
+    struct Close {
+        void operator()(std::FILE* file) const { std::fclose(file); }
+    };
+
+    std::string path_;
+    std::unique_ptr<std::FILE, Close> file_;
+    std::size_t size_ = 0;
+    int error_ = 0;
+};
 
 // Appends `pieces` to the file at `path`, which is made when there is none. All or nothing: a file that was
 // there keeps what it held when the writing fails, and a file that was empty or not there is at no moment

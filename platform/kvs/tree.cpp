@@ -1,5 +1,7 @@
 #include "platform/kvs/tree.h"
 
+#include "platform/kvs/lexicon.h"
+
 #include <algorithm>
 
 namespace kota::kvs {
@@ -16,24 +18,12 @@ NameIndex::Family sectionsOf(Tree::SectionId section) {
 
 } // namespace
 
-Tree::Tree(std::unique_ptr<char[]> text, std::size_t length) : text_(std::move(text)), length_(length) {
-    // Room for all that the text can hold, so that nothing is ever moved: each '=' begins a keyword with one
-    // parameter, each ',' brings one more, and no two elements fit into fewer than four bytes. Memory that is
-    // never touched costs nothing.
-    const char* begin = text_.get();
-    const auto count = [&](char c) {
-        return static_cast<std::size_t>(std::count(begin, begin + length_, c));
-    };
-    cells_.reserve(std::min(2 * count('=') + count(','), length_ / 2 + 1));
+Tree::Tree(std::size_t textLength) {
+    // Room for all that the text can hold, so that nothing is ever moved: no element is shorter than two
+    // bytes. Memory that is never touched costs nothing.
+    constexpr std::size_t most = std::size_t{1} << 28;
+    cells_.reserve(std::min(textLength / 2 + 1, most));
     sections_.emplace_back(this, NameIndex::none);
-}
-
-char* Tree::roomForDecoded() {
-    if (!decoded_) {
-        decoded_ = std::make_unique_for_overwrite<char[]>(length_);
-        decodedEnd_ = decoded_.get();
-    }
-    return decodedEnd_;
 }
 
 Tree::SectionId Tree::addSection(SectionId parent, std::string_view name) {
@@ -43,16 +33,28 @@ Tree::SectionId Tree::addSection(SectionId parent, std::string_view name) {
 }
 
 void Tree::addKeyword(SectionId parent, std::string_view name) {
+    endKeyword();
     lastKeyword_ = cells_.size();
     cells_.push_back(Cell::keyword(index_.count(keywordsOf(parent), name)));
 }
 
-void Tree::addParameter(Cell parameter) {
-    cells_.push_back(parameter);
-    cells_[lastKeyword_].countParameter();
+void Tree::endKeyword() {
+    if (!cells_.empty())
+        cells_[lastKeyword_].setParameterCount(static_cast<std::uint32_t>(cells_.size() - lastKeyword_ - 1));
+}
+
+// River names and the like come again and again: a string that stood a little earlier is shared.
+void Tree::addString(std::string_view value) {
+    const auto last = value.empty() ? 0u : static_cast<unsigned char>(value.back());
+    const auto first = value.empty() ? 0u : static_cast<unsigned char>(value.front());
+    const CString*& recent = recentStrings_[(value.size() * 7 + last * 3 + first) % recentStrings_.size()];
+    if (!recent || !sameName(recent->View(), value))
+        recent = &strings_.emplace_back(value);
+    addParameter(Cell::ofString(*recent));
 }
 
 void Tree::finish() {
+    endKeyword();
     for (SectionId id = 1; id < sections_.size(); ++id)
         index_.place(sections_[id].group(), id);
     for (std::uint32_t head = 0; head < cells_.size(); head += 1 + cells_[head].parameterCount())
@@ -71,12 +73,6 @@ const Cell* Section::keyword(std::string_view name, int number) const {
     const auto heads = tree_->index_.elements(keywordsOf(id), name);
     const auto place = static_cast<std::size_t>(number) - 1;
     return number >= 1 && place < heads.size() ? &tree_->cells_[heads[place]] : nullptr;
-}
-
-const Cell* parameter(const Cell* keyword, int place) {
-    const bool exists =
-        keyword && place >= 1 && static_cast<std::uint32_t>(place) <= keyword->parameterCount();
-    return exists ? keyword + place : nullptr;
 }
 
 } // namespace kota::kvs

@@ -3,8 +3,9 @@
 #include "platform/kvs/cell.h"
 #include "platform/kvs/name_index.h"
 
+#include <array>
 #include <cstdint>
-#include <memory>
+#include <deque>
 #include <string_view>
 #include <vector>
 
@@ -28,28 +29,22 @@ private:
 };
 
 // A file as it was read: sections and keywords in file order, found by name and number. Built once, from
-// the front to the back, then only read. It owns the text in which its names and strings stand.
+// the front to the back, then only read.
 class Tree {
 public:
     using SectionId = std::uint32_t;
     static constexpr SectionId file = 0;
 
-    // `text` is the whole file, `length` bytes and one more.
-    Tree(std::unique_ptr<char[]> text, std::size_t length);
+    // `textLength` is how long the file is, which tells how much room there must be at the most.
+    explicit Tree(std::size_t textLength);
     Tree(const Tree&) = delete;
     Tree& operator=(const Tree&) = delete;
 
-    const char* text() const { return text_.get(); }
-    std::size_t textLength() const { return length_; }
-
-    // Building. Names and strings are not copied: they stand in the text or, where they had to be decoded, in
-    // room beside it. A string decoded into that room is kept by naming its end.
-    char* roomForDecoded();
-    void keepDecoded(char* end) { decodedEnd_ = end; }
+    // Building. Parameters go to the keyword added last.
     SectionId addSection(SectionId parent, std::string_view name);
     void addKeyword(SectionId parent, std::string_view name);
-    // Adds a parameter to the keyword added last.
-    void addParameter(Cell parameter);
+    void addParameter(Cell parameter) { cells_.push_back(parameter); }
+    void addString(std::string_view value);
     // Everything was added: from here on elements can be found.
     void finish();
 
@@ -58,17 +53,21 @@ public:
 private:
     friend class Section;
 
-    std::unique_ptr<char[]> text_;
-    std::size_t length_;
-    std::unique_ptr<char[]> decoded_; // as long as the text, made at the first need
-    char* decodedEnd_ = nullptr;
+    void endKeyword();
+
     std::vector<Section> sections_;
     std::vector<Cell> cells_;
-    std::size_t lastKeyword_ = 0;
+    std::size_t lastKeyword_ = 0; // its head's place in `cells_`
     NameIndex index_;
+    std::deque<CString> strings_;
+    std::array<const CString*, 64> recentStrings_{}; // the last one of each kind, by length and letters
 };
 
 // The n-th parameter of a keyword, from 1; null when there is none.
-const Cell* parameter(const Cell* keyword, int place);
+inline const Cell* parameter(const Cell* keyword, int place) {
+    const bool exists =
+        keyword && place >= 1 && static_cast<std::uint32_t>(place) <= keyword->parameterCount();
+    return exists ? keyword + place : nullptr;
+}
 
 } // namespace kota::kvs

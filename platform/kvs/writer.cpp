@@ -1,20 +1,31 @@
 #include "platform/kvs/writer.h"
 
+#include "platform/kvs/double_text.h"
 #include "platform/kvs/lexicon.h"
 
 #include <algorithm>
 #include <charconv>
-#include <cmath>
+#include <cstring>
 
 namespace kota::kvs {
 
 namespace {
 
 constexpr std::size_t pieceSize = std::size_t{1} << 20;
-constexpr std::size_t longestNumber = 32;
+constexpr std::size_t longestInt = 11;
 constexpr int indent = 2;
 
+constexpr bool isPlainInString(char c) {
+    return c >= ' ' && c <= '~' && c != '"' && c != '\\';
+}
+
 } // namespace
+
+inline void Writer::append(std::string_view text) {
+    char* to = room(text.size());
+    std::memcpy(to, text.data(), text.size());
+    keep(to + text.size());
+}
 
 void Writer::addTarget(std::string_view name) {
     while (depth_ > 0)
@@ -51,25 +62,14 @@ void Writer::addKeyword(std::string_view name) {
 void Writer::addInt(int value) {
     if (!beginParameter())
         return;
-    char* start = room(longestNumber);
-    keep(std::to_chars(start, start + longestNumber, value).ptr);
+    char* start = room(longestInt);
+    keep(std::to_chars(start, start + longestInt, value).ptr);
 }
 
 void Writer::addDouble(double value) {
     if (!beginParameter())
         return;
-    if (std::isnan(value)) {
-        append("nan");
-        return;
-    }
-    char* start = room(longestNumber);
-    char* end = std::to_chars(start, start + longestNumber, value).ptr;
-    const bool looksLikeInt = std::all_of(start, end, [](char c) { return isDigit(c) || c == '-'; });
-    if (looksLikeInt) {
-        *end++ = '.';
-        *end++ = '0';
-    }
-    keep(end);
+    keep(writeDouble(room(longestDouble), value));
 }
 
 void Writer::addBool(bool value) {
@@ -88,26 +88,23 @@ const std::vector<std::string_view>& Writer::finish() {
     while (depth_ > 0)
         endSection();
     endLine();
-    text_.clear();
-    for (const Piece& piece : pieces_)
-        text_.emplace_back(piece.bytes.get(), piece.used);
+    endPiece();
     return text_;
 }
 
-char* Writer::room(std::size_t length) {
-    if (pieces_.empty() || pieces_.back().size - pieces_.back().used < length) {
-        const std::size_t size = std::max(length, pieceSize);
-        pieces_.push_back({std::make_unique_for_overwrite<char[]>(size), size, 0});
-    }
-    return pieces_.back().bytes.get() + pieces_.back().used;
+void Writer::addPiece(std::size_t length) {
+    endPiece();
+    const std::size_t size = std::max(length, pieceSize);
+    pieces_.push_back(std::make_unique_for_overwrite<char[]>(size));
+    at_ = pieces_.back().get();
+    limit_ = at_ + size;
+    text_.emplace_back(at_, 0);
 }
 
-void Writer::keep(char* end) {
-    pieces_.back().used = static_cast<std::size_t>(end - pieces_.back().bytes.get());
-}
-
-void Writer::append(std::string_view text) {
-    keep(std::ranges::copy(text, room(text.size())).out);
+// Brings the view of the last piece up to date.
+void Writer::endPiece() {
+    if (!pieces_.empty())
+        text_.back() = {pieces_.back().get(), at_};
 }
 
 void Writer::endLine() {
@@ -129,7 +126,11 @@ bool Writer::beginParameter() {
         misplaced("parameter", "");
         return false;
     }
-    append(keyword_ == Keyword::Empty ? " " : ", ");
+    char* to = room(2);
+    if (keyword_ == Keyword::Filled)
+        *to++ = ',';
+    *to++ = ' ';
+    keep(to);
     keyword_ = Keyword::Filled;
     return true;
 }
@@ -157,8 +158,13 @@ void Writer::appendQuoted(std::string_view text) {
     *to++ = '"';
     const auto put = [&](std::string_view bytes) { to = std::ranges::copy(bytes, to).out; };
     for (std::size_t at = 0; at < text.size();) {
-        const int length = utf8Length(text.substr(at));
         const char c = text[at];
+        if (isPlainInString(c)) {
+            *to++ = c;
+            ++at;
+            continue;
+        }
+        const int length = utf8Length(text.substr(at));
         if (c == '"' || c == '\\')
             put(std::string{'\\', c});
         else if (c == '\n')

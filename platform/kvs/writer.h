@@ -33,8 +33,14 @@ public:
 
 private:
     // `length` bytes to write into, at the end of the text; what was written is kept by naming its end.
-    char* room(std::size_t length);
-    void keep(char* end);
+    char* room(std::size_t length) {
+        if (static_cast<std::size_t>(limit_ - at_) < length)
+            addPiece(length);
+        return at_;
+    }
+    void keep(char* end) { at_ = end; }
+    void addPiece(std::size_t length);
+    void endPiece();
 
     void append(std::string_view text);
     void beginLine();
@@ -45,13 +51,10 @@ private:
     void appendQuoted(std::string_view text);
     void misplaced(std::string_view element, std::string_view name);
 
-    struct Piece {
-        std::unique_ptr<char[]> bytes;
-        std::size_t size;
-        std::size_t used;
-    };
-    std::vector<Piece> pieces_;
-    std::vector<std::string_view> text_;
+    std::vector<std::unique_ptr<char[]>> pieces_; // of memory; the last one is written up to `at_`
+    std::vector<std::string_view> text_;          // what was written into each
+    char* at_ = nullptr;
+    char* limit_ = nullptr;
     std::string misuse_;
     int depth_ = 0;
     bool lineOpen_ = false;
