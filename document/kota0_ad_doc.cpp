@@ -11,6 +11,7 @@
 #include "resources/module.h"
 
 #include <cstdio>
+#include <utility>
 
 namespace {
 
@@ -145,7 +146,7 @@ int CKota0_adDoc::GetCompNum(CString name) {
 int CKota0_adDoc::GetProjectInfo(CView* view, CString documentName) {
     CKHComm_Package package;
     package.sender = view;
-    package.documentName = documentName;
+    package.documentName = std::move(documentName);
     projectHandle = sendToShell(switchBoardMessage(), SwitchBoardCode::JoinProject, package);
     return projectHandle != 0 ? 1 : 0;
 }
@@ -155,7 +156,7 @@ void CKota0_adDoc::LeaveProject(CView* view, CString documentName) {
         return;
     CKHComm_Package package;
     package.sender = view;
-    package.documentName = documentName;
+    package.documentName = std::move(documentName);
     package.project = projectHandle;
     sendToShell(switchBoardMessage(), SwitchBoardCode::LeaveProject, package);
 }
@@ -164,7 +165,7 @@ void CKota0_adDoc::DataChange(CString documentName) {
     if (projectHandle == 0)
         return;
     CKHComm_Package package;
-    package.documentName = documentName;
+    package.documentName = std::move(documentName);
     package.project = projectHandle;
     sendToShell(communicationMessage(), CommunicationCode::DataChanged, package);
 }

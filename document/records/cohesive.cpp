@@ -11,6 +11,8 @@ struct Keyword {
     const char* name;
     Form form;
 };
+template <class Form>
+Keyword(const char*, Form) -> Keyword<Form>;
 
 // The record on file: its keywords in their order, each with its parameters.
 constexpr auto keywords = std::tuple(

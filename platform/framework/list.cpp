@@ -175,11 +175,12 @@ void CList<Type, Argument>::AddBlock() {
     static_assert(std::is_trivially_destructible_v<Node> && sizeof(Block) % alignof(Node) == 0);
     void* const room = ::operator new(sizeof(Block) + blockSize_ * sizeof(Node));
     blocks_ = new (room) Block{blocks_};
-    for (int i = blockSize_ - 1; i >= 0; --i) {
-        Node* node = new (blocks_->nodes() + i) Node;
+    int i = blockSize_;
+    do {
+        Node* node = new (blocks_->nodes() + --i) Node;
         node->next = free_;
         free_ = node;
-    }
+    } while (i > 0);
 }
 
 template <class Type, class Argument>

@@ -13,7 +13,7 @@ class KOTA_API CString {
 public:
     CString() noexcept {}
     // A null pointer gives the empty text.
-    CString(const char* text); // NOLINT(google-explicit-constructor): a literal is a text
+    CString(const char* text);
     explicit CString(std::string_view text);
     CString(const CString& other);
     CString(CString&& other) noexcept : bytes_(other.bytes_) { other.bytes_ = nullptr; }
@@ -33,7 +33,7 @@ public:
     void Empty();
 
     // The bytes, ended by a NUL, valid until the text changes.
-    operator const char*() const; // NOLINT(google-explicit-constructor): the framework's manner
+    operator const char*() const;
     std::string_view View() const;
 
     CString& operator+=(const CString& tail);

@@ -21,9 +21,8 @@ namespace kota::kvs {
 
 // Where a value read from a list goes to: an int or a double of the caller's.
 struct Destination {
-    Destination(int* address) : format('i'), intAddress(address) {} // NOLINT(google-explicit-constructor)
-    Destination(double* address)
-        : format('d'), doubleAddress(address) {} // NOLINT(google-explicit-constructor)
+    Destination(int* address) : format('i'), intAddress(address) {}
+    Destination(double* address) : format('d'), doubleAddress(address) {}
 
     char format; // the letter that goes with it
     int* intAddress = nullptr;
@@ -32,8 +31,8 @@ struct Destination {
 
 // A value to be written into a list.
 struct Source {
-    Source(int value) : format('i'), intValue(value) {}       // NOLINT(google-explicit-constructor)
-    Source(double value) : format('d'), doubleValue(value) {} // NOLINT(google-explicit-constructor)
+    Source(int value) : format('i'), intValue(value) {}
+    Source(double value) : format('d'), doubleValue(value) {}
 
     char format;
     int intValue = 0;

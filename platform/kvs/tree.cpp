@@ -45,9 +45,11 @@ void Tree::endKeyword() {
 
 // River names and the like come again and again: a string that stood a little earlier is shared.
 void Tree::addString(std::string_view value) {
-    const auto last = value.empty() ? 0u : static_cast<unsigned char>(value.back());
-    const auto first = value.empty() ? 0u : static_cast<unsigned char>(value.front());
-    const CString*& recent = recentStrings_[(value.size() * 7 + last * 3 + first) % recentStrings_.size()];
+    const auto letter = [&](std::size_t at) {
+        return at < value.size() ? static_cast<unsigned char>(value[at]) : 0u;
+    };
+    const std::size_t kind = value.size() * 7 + letter(0) + letter(value.size() - 1);
+    const CString*& recent = recentStrings_[kind % recentStrings_.size()];
     if (!recent || !sameName(recent->View(), value))
         recent = &strings_.emplace_back(value);
     addParameter(Cell::ofString(*recent));

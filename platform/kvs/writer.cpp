@@ -117,7 +117,7 @@ void Writer::endLine() {
 void Writer::beginLine() {
     endLine();
     lineOpen_ = true;
-    const auto blanks = static_cast<std::size_t>(depth_ * indent);
+    const auto blanks = static_cast<std::size_t>(depth_) * indent;
     keep(std::fill_n(room(blanks), blanks, ' '));
 }
 
