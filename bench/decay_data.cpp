@@ -12,6 +12,7 @@
 #include <rapidjson/filewritestream.h>
 #include <rapidjson/writer.h>
 #include <stdexcept>
+#include <string_view>
 
 namespace bench {
 
@@ -61,40 +62,54 @@ void addDecay(CKota0_adDoc& document, const std::vector<PlainDecay>& records) {
     }
 }
 
-void writeJson(const std::string& path, const std::vector<PlainDecay>& records) {
+void writeJson(const std::string& path, const std::vector<PlainDecay>& records, JsonForm form) {
     const OpenFile file = open(path, "wb");
     std::vector<char> buffer(streamBuffer);
     rapidjson::FileWriteStream stream(file.get(), buffer.data(), buffer.size());
     rapidjson::Writer writer(stream);
+    const bool named = form == JsonForm::Objects;
+    const auto key = [&](std::string_view name) {
+        if (named)
+            writer.Key(name.data(), static_cast<rapidjson::SizeType>(name.size()));
+    };
     writer.StartArray();
     for (const PlainDecay& record : records) {
-        writer.StartArray();
+        named ? writer.StartObject() : writer.StartArray();
+        key("component");
         writer.Int(record.componentNum);
+        key("decay");
         writer.Double(record.decayConst);
+        key("global");
         writer.Bool(record.isGlobal);
+        key("river");
         writer.String(record.riverName.data(), static_cast<rapidjson::SizeType>(record.riverName.size()));
+        key("chainage");
         writer.Double(record.chainage);
-        writer.EndArray();
+        named ? writer.EndObject() : writer.EndArray();
     }
     writer.EndArray();
     stream.Flush();
 }
 
-std::vector<PlainDecay> readJson(const std::string& path) {
+std::vector<PlainDecay> readJson(const std::string& path, JsonForm form) {
     const OpenFile file = open(path, "rb");
     std::vector<char> buffer(streamBuffer);
     rapidjson::FileReadStream stream(file.get(), buffer.data(), buffer.size());
-    rapidjson::Document json;
+    // Never freed: it goes with the process, as the other side's records do.
+    auto& json = *new rapidjson::Document;
     json.ParseStream(stream);
     if (json.HasParseError() || !json.IsArray())
         throw std::runtime_error("not the JSON that was written");
     std::vector<PlainDecay> records;
     records.reserve(json.Size());
-    for (const auto& row : json.GetArray())
-        records.push_back(
-            {row[0].GetInt(), row[1].GetDouble(), row[2].GetBool(), row[3].GetString(), row[4].GetDouble()});
-    // Freed with the process, as the other side's records are.
-    new rapidjson::Document(std::move(json));
+    for (const auto& row : json.GetArray()) {
+        if (form == JsonForm::Objects)
+            records.push_back({row["component"].GetInt(), row["decay"].GetDouble(), row["global"].GetBool(),
+                               row["river"].GetString(), row["chainage"].GetDouble()});
+        else
+            records.push_back({row[0].GetInt(), row[1].GetDouble(), row[2].GetBool(), row[3].GetString(),
+                               row[4].GetDouble()});
+    }
     return records;
 }
 

@@ -20,8 +20,11 @@ struct PlainDecay {
 std::vector<PlainDecay> makeDecay(int count);
 void addDecay(CKota0_adDoc& document, const std::vector<PlainDecay>& records);
 
-// The records as a JSON array of arrays, in the order of the record's parameters on file.
-void writeJson(const std::string& path, const std::vector<PlainDecay>& records);
-std::vector<PlainDecay> readJson(const std::string& path);
+// How a record stands in JSON: an object with named members, or an array in the order of the record's
+// parameters on file.
+enum class JsonForm { Objects, Arrays };
+
+void writeJson(const std::string& path, const std::vector<PlainDecay>& records, JsonForm form);
+std::vector<PlainDecay> readJson(const std::string& path, JsonForm form);
 
 } // namespace bench

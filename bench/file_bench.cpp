@@ -12,12 +12,17 @@
 namespace {
 
 namespace fs = std::filesystem;
+using bench::JsonForm;
 
 constexpr int smallCount = 100'000;
 constexpr int largeCount = 1'000'000;
 
 std::string pathOf(int count, const char* ending) {
     return (fs::temp_directory_path() / ("kota0_ad_bench_" + std::to_string(count) + ending)).string();
+}
+
+std::string jsonPath(int count, JsonForm form) {
+    return pathOf(count, form == JsonForm::Objects ? "_objects.json" : "_arrays.json");
 }
 
 // A document that is never freed: it goes with the measured process.
@@ -29,8 +34,9 @@ std::function<void()> readingDocument(int count) {
     return [path = pathOf(count, ".AD31")] { newDocument().ReadData(path.c_str()); };
 }
 
+template <JsonForm form>
 std::function<void()> readingJson(int count) {
-    return [path = pathOf(count, ".json")] { new std::vector(bench::readJson(path)); };
+    return [path = jsonPath(count, form)] { new std::vector(bench::readJson(path, form)); };
 }
 
 std::function<void()> writingDocument(int count) {
@@ -39,9 +45,10 @@ std::function<void()> writingDocument(int count) {
     return [&document, path = pathOf(count, ".AD31")] { document.WriteData(path.c_str()); };
 }
 
+template <JsonForm form>
 std::function<void()> writingJson(int count) {
-    return [records = bench::makeDecay(count), path = pathOf(count, ".json")] {
-        bench::writeJson(path, records);
+    return [records = bench::makeDecay(count), path = jsonPath(count, form)] {
+        bench::writeJson(path, records, form);
     };
 }
 
@@ -58,14 +65,20 @@ void run(benchmark::State& state, std::function<void()> (*prepare)(int)) {
 void ReadData(benchmark::State& state) {
     run(state, readingDocument);
 }
-void RapidJsonRead(benchmark::State& state) {
-    run(state, readingJson);
+void ReadJsonObjects(benchmark::State& state) {
+    run(state, readingJson<JsonForm::Objects>);
+}
+void ReadJsonArrays(benchmark::State& state) {
+    run(state, readingJson<JsonForm::Arrays>);
 }
 void WriteData(benchmark::State& state) {
     run(state, writingDocument);
 }
-void RapidJsonWrite(benchmark::State& state) {
-    run(state, writingJson);
+void WriteJsonObjects(benchmark::State& state) {
+    run(state, writingJson<JsonForm::Objects>);
+}
+void WriteJsonArrays(benchmark::State& state) {
+    run(state, writingJson<JsonForm::Arrays>);
 }
 
 void bothSizes(benchmark::internal::Benchmark* benchmark) {
@@ -74,9 +87,11 @@ void bothSizes(benchmark::internal::Benchmark* benchmark) {
 }
 
 BENCHMARK(WriteData)->Apply(bothSizes);
-BENCHMARK(RapidJsonWrite)->Apply(bothSizes);
+BENCHMARK(WriteJsonObjects)->Apply(bothSizes);
+BENCHMARK(WriteJsonArrays)->Apply(bothSizes);
 BENCHMARK(ReadData)->Apply(bothSizes);
-BENCHMARK(RapidJsonRead)->Apply(bothSizes);
+BENCHMARK(ReadJsonObjects)->Apply(bothSizes);
+BENCHMARK(ReadJsonArrays)->Apply(bothSizes);
 
 } // namespace
 
@@ -85,15 +100,20 @@ int main(int argc, char** argv) {
     // The files to be read, made in processes of their own so that this one stays small.
     for (const int count : {smallCount, largeCount}) {
         bench::runCold([=] { return writingDocument(count); });
-        bench::runCold([=] { return writingJson(count); });
+        bench::runCold([=] { return writingJson<JsonForm::Objects>(count); });
+        bench::runCold([=] { return writingJson<JsonForm::Arrays>(count); });
     }
     bench::RatioReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
 
     for (const int count : {smallCount, largeCount}) {
         const std::string arg = "/" + std::to_string(count);
-        reporter.printRatio("ReadData against RapidJSON" + arg, "ReadData" + arg, "RapidJsonRead" + arg);
-        reporter.printRatio("WriteData against RapidJSON" + arg, "WriteData" + arg, "RapidJsonWrite" + arg);
+        for (const std::string form : {"Objects", "Arrays"}) {
+            reporter.printRatio("ReadData against RapidJSON, " + form + arg, "ReadData" + arg,
+                                "ReadJson" + form + arg);
+            reporter.printRatio("WriteData against RapidJSON, " + form + arg, "WriteData" + arg,
+                                "WriteJson" + form + arg);
+        }
     }
     const std::string small = "/" + std::to_string(smallCount);
     const std::string large = "/" + std::to_string(largeCount);
@@ -104,6 +124,7 @@ int main(int argc, char** argv) {
                          "WriteData" + small, sizes);
 
     for (const int count : {smallCount, largeCount})
-        for (const char* ending : {".AD31", ".json"})
-            fs::remove(pathOf(count, ending));
+        for (const std::string& path :
+             {pathOf(count, ".AD31"), jsonPath(count, JsonForm::Objects), jsonPath(count, JsonForm::Arrays)})
+            fs::remove(path);
 }

@@ -69,7 +69,7 @@ inline constexpr WPARAM InsertData = 62;       // to a view: a sibling inserts i
 inline constexpr WPARAM DeleteData = 82;       // to a view: a sibling deletes items[0]
 inline constexpr WPARAM LocationChanged = 503; // to the main window: items is the current location; no
                                                // package when the view goes away
-inline constexpr WPARAM DataChanged = 523; // to the main window: the document's data changed
+inline constexpr WPARAM DataChanged = 523;     // to the main window: the document's data changed
 } // namespace CommunicationCode
 
 // wParam of "KOTAHubSwitchBoardSevice", to the main window. The answer is the result of SendMessage.
