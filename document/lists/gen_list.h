@@ -18,7 +18,7 @@ public:
     virtual void Load(void* targetOrSection) = 0;
     // Removes and deletes all records.
     virtual void DeleteAll() = 0;
-    // Removes and deletes the records that are not filled in far enough to mean anything, and sets `*changed`
-    // to 1 if there were any. Always 1.
+    // Removes and deletes the records that are not filled in far enough to mean anything. If there were any
+    // and `*changed` is 0, it becomes 1. Always gives 1.
     virtual int RemoveEmptyLines(int* changed) = 0;
 };

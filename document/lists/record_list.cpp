@@ -95,7 +95,8 @@ int RecordList<Record>::RemoveEmptyLines(int* changed) {
             continue;
         RemoveAt(at);
         delete record;
-        *changed = 1;
+        if (*changed == 0)
+            *changed = 1;
     }
     return 1;
 }

@@ -215,6 +215,8 @@ Cell Reader::number() {
     constexpr std::uint64_t mostExact = std::uint64_t{1} << 53;
     std::uint64_t digits = 0;
     const char* at = at_;
+    while (*at == '0' && isDigit(at[1]))
+        ++at;
     const auto readDigits = [&] {
         const char* const first = at;
         for (; isDigit(*at); ++at)
