@@ -5,7 +5,6 @@
 #include <cstdarg>
 #include <cstdint>
 #include <cstdio>
-#include <cstring>
 #include <new>
 #include <ostream>
 #include <stdexcept>
@@ -31,7 +30,7 @@ struct CString::Bytes {
 
     // Within the capacity.
     void append(std::string_view tail) {
-        std::memmove(text() + length, tail.data(), tail.size());
+        std::copy(tail.begin(), tail.end(), text() + length);
         length += static_cast<std::uint32_t>(tail.size());
         text()[length] = '\0';
     }
