@@ -17,8 +17,8 @@ class Cell {
 public:
     enum class Type : std::uint16_t { Double = 0, Int = 0xFFF9, Bool = 0xFFFA, String = 0xFFFB };
 
-    // The head of a keyword of a group of the name index. It has no type.
-    static Cell keyword(std::uint32_t group) { return Cell(group); }
+    // The head of a keyword, by the number of its name. It has no type.
+    static Cell keyword(std::uint32_t name) { return Cell(name); }
     static Cell ofInt(std::int32_t value) { return boxed(Type::Int, static_cast<std::uint32_t>(value)); }
     static Cell ofBool(bool value) { return boxed(Type::Bool, value ? 1 : 0); }
     static Cell ofDouble(double value) {
@@ -31,9 +31,9 @@ public:
     }
 
     // Of a keyword's head alone.
-    std::uint32_t group() const { return static_cast<std::uint32_t>(bits_); }
+    std::uint32_t name() const { return static_cast<std::uint32_t>(bits_); }
     std::uint32_t parameterCount() const { return static_cast<std::uint32_t>(bits_ >> 32); }
-    void setParameterCount(std::uint32_t count) { bits_ = std::uint64_t{count} << 32 | group(); }
+    void setParameterCount(std::uint32_t count) { bits_ = std::uint64_t{count} << 32 | name(); }
 
     // Of a parameter alone.
     Type type() const {
