@@ -59,12 +59,12 @@ BOOL CKota0_adDoc::OnOpenDocument(const char* path) {
     if (!CKhDoc::OnOpenDocument(path))
         return FALSE;
     filePath = path;
-    const CString extension = SplitPath(path).extension;
+    const CString extension = SplitPath(filePath).extension;
     if (extension != writtenExtension && extension != lowerCaseExtension) {
         MessageBox(nullptr, kota0AdModule().string(StringId::UnsupportedFileFormat), nullptr, MB_OK);
         return FALSE;
     }
-    ReadData(path);
+    ReadData(filePath);
     return TRUE;
 }
 
@@ -171,8 +171,10 @@ void CKota0_adDoc::DataChange(CString documentName) {
 }
 
 void CKota0_adDoc::UpdateAll(CView* sender, int hint, CObject* hintObject) {
+    // Another view may close the sender while it is updated.
+    const HWND senderWindow = sender ? sender->GetSafeHwnd() : nullptr;
     SetModifiedFlag(TRUE);
     UpdateAllViews(sender, hint, hintObject);
-    if (sender)
-        sender->SetFocus();
+    if (IsWindow(senderWindow))
+        SetFocus(senderWindow);
 }

@@ -22,8 +22,9 @@ public:
     // Deletes the records of all lists. The global values stay as they are.
     void DeleteContents() override;
     BOOL OnNewDocument() override;
-    // 0 for a file that cannot be opened or whose extension is neither ".ad31" nor ".AD31". A file with a
-    // syntax error opens as an empty document, after the user was told.
+    // 0 for a file that cannot be opened, and then the document is as it was; and for one whose extension is
+    // neither ".ad31" nor ".AD31", and then filePath is set and the lists are empty. A file with a syntax
+    // error opens as an empty document, after the user was told.
     BOOL OnOpenDocument(const char* path) override;
     // Lets the views store what they show, drops incomplete lines, and writes the file, its extension always
     // ".AD31". 0, with nothing written, when a sediment component has no global line.

@@ -19,6 +19,6 @@ public:
     // Removes and deletes all records.
     virtual void DeleteAll() = 0;
     // Removes and deletes the records that are not filled in far enough to mean anything. If there were any
-    // and `*changed` is 0, it becomes 1. Always gives 1.
+    // and `*changed`, which must not be null, is 0, it becomes 1. Always gives 1.
     virtual int RemoveEmptyLines(int* changed) = 0;
 };

@@ -14,7 +14,7 @@ public:
     void Save(void* file) override;
     void Load(void* keyword) override;
 
-    double kMix = 0.0;
+    double kMix = 0.0;    // 1/h
     int boundaryType = 0; // a BoundaryType
 };
 
@@ -27,8 +27,8 @@ public:
     void Save(void* file) override;
     void Load(void* keyword) override;
 
-    double kMixTop = 0.0;
-    double kMixBottom = 0.0;
+    double kMixTop = 0.0;       // 1/h
+    double kMixBottom = 0.0;    // 1/h
     int boundaryTypeTop = 0;    // a BoundaryType
     int boundaryTypeBottom = 0; // a BoundaryType
 };

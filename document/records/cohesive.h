@@ -16,26 +16,34 @@ public:
     // Reads them from the record's section, each by its name.
     void Load(void* section) override;
 
+    // Fall velocity.
     double cOffset = 10.0;
     double g = 4.5;
     double m = 0.0;
-    double w0 = 0.005;
+    double w0 = 0.005; // m/s
     double swi = 0.000392;
+
+    // Deposition.
     double timeCentering = 0.8;
-    double critShearDep = 0.05;
-    int instantErosion = 1; // not 0: layer 1 erodes at once
-    double critShearEro1 = 0.07;
+    double critShearDep = 0.05; // N/m^2 or m/s, by depShearMode
+
+    // Erosion, by layers.
+    int instantErosion = 1;      // not 0: layer 1 erodes at once
+    double critShearEro1 = 0.07; // N/m^2 or m/s, by eroShearMode
     double critShearEro2 = 0.3;
     double critShearEro3 = 0.3;
-    double eroCoef1 = 0.2;
+    double eroCoef1 = 0.2; // g/(m^2 s)
     double eroCoef2 = 0.2;
     double eroCoef3 = 0.2;
     double eroExp1 = 3.0;
     double eroExp2 = 3.0;
     double eroExp3 = 3.0;
-    double tran12 = 2.85;
-    double tran23 = 0.15;
-    double slidFrCoef = 5.0;
-    int depShearMode = 0; // a ShearMode, of critShearDep
-    int eroShearMode = 0; // a ShearMode, of critShearEro1 to 3
+
+    // Consolidation.
+    double tran12 = 2.85;    // g/(m^2 s)
+    double tran23 = 0.15;    // g/(m^2 s)
+    double slidFrCoef = 5.0; // m^0.5/s
+
+    int depShearMode = 0; // a ShearMode
+    int eroShearMode = 0; // a ShearMode
 };

@@ -46,7 +46,7 @@ public:
     double G_rel_dens;
     double G_thetac;
 
-    // The ice model; carried along.
+    // The ice model; carried along from file to file, and shown nowhere.
     double G_Ice_latitude;
     double G_Ice_dens_water;
     double G_Ice_spec_heat_water;

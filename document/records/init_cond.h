@@ -15,7 +15,7 @@ public:
 };
 
 // The initial condition of a component in stratified water: concentrations from the surface to the bottom,
-// and the two mixing coefficients between the layers.
+// and two coefficients of the exchange between them, which the editor hands on as they are.
 class KOTA0_AD_API AD_Init_cond_stra : public AD_Comp_RiverPos {
 public:
     AD_Init_cond_stra(); // global

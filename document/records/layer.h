@@ -16,8 +16,8 @@ public:
 
     double height = 0.0;      // m
     double density = 1029.56; // kg/m^3
-    double potFac = 0.0;
-    int useTable = 0; // not 0: the table holds instead of `height`
-    int layer = 0;    // 0 upper, 1 middle, 2 lower
+    double potFac = 0.0;      // potency factor
+    int useTable = 0;         // not 0: the table holds instead of `height`
+    int layer = 0;            // 0 upper, 1 middle, 2 lower, -1 none
     CAdderList adderList;
 };

@@ -28,13 +28,15 @@ public:
     // The file was written: the old content stays in NAME~.
     void written();
 
+    // NAME~ of a file.
     static std::filesystem::path keptName(const std::filesystem::path& file);
 
 private:
     void keep();
-    bool changed() const;
+    void takeBack();
+    bool isUntouched() const;
 
-    std::filesystem::path file_;  // the file itself, where NAME is a link
+    std::filesystem::path file_;  // without links
     std::filesystem::path kept_;  // NAME~
     std::filesystem::path older_; // NAME~~: what NAME~ held before, for as long as the save lasts
     std::uintmax_t size_ = 0;

@@ -49,6 +49,7 @@ CString CKhDoc::WrittenPathName(const char* path) const {
 }
 
 BOOL CKhDoc::OnOpenDocument(const char* path) {
+    path = path ? path : "";
     CString message;
     if (const std::string reason = unreadable(path); !reason.empty()) {
         message.Format("%s cannot be opened: %s.", path, reason.c_str());

@@ -16,9 +16,9 @@ public:
     void SetModifiedFlag(BOOL modified = TRUE) override;
 
     // Saves through OnSaveDocument, and so that nothing is lost: the version before is kept as NAME~ beside
-    // the file. When the file library could not write, the old file is put back, the user is told why, the
-    // document is marked as modified, and the result is 0. After a save the document's path and title are
-    // those of the file that was written.
+    // the file, whose folder must be writable for that. When the file library could not write, the old file
+    // is put back, the user is told why, the document is marked as modified, and the result is 0. After a
+    // save the document's path and title are those of the file that was written.
     BOOL DoSave(const char* path) override;
 
 protected:

@@ -22,7 +22,7 @@ void CDocument::SetTitle(const char* title) {
 
 void CDocument::SetPathName(const char* path) {
     pathName_ = path;
-    const PathParts parts = SplitPath(path);
+    const PathParts parts = SplitPath(pathName_);
     SetTitle(parts.fileName + parts.extension);
 }
 

@@ -32,13 +32,14 @@ public:
     // The views in the order in which they were added.
     const std::vector<CView*>& Views() const { return views_; }
     // Calls OnUpdate of every view but the sender; null leaves none out. A view that another view's OnUpdate
-    // takes away is not called.
+    // takes away is not called. The document itself must outlive the call.
     void UpdateAllViews(CView* sender, LPARAM hint = 0, CObject* hintObject = nullptr);
 
     virtual void Serialize(CArchive& archive);
     // Empties the document before it is used anew or destroyed.
     virtual void DeleteContents();
-    // Makes the document a new one: empty, without a path, not modified. 1 done.
+    // Makes the document a new one: empty, without a path, not modified. The title is the caller's to set.
+    // 1 done.
     virtual BOOL OnNewDocument();
     // Reads the file. 1 done, 0 when the document is not open.
     virtual BOOL OnOpenDocument(const char* path) = 0;

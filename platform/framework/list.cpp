@@ -11,7 +11,7 @@ struct CList<Type, Argument>::Node : kota::ListNode {
     Type value{};
 };
 
-// Nodes allocated together, behind this head. All blocks are freed when the list becomes empty.
+// Nodes allocated together, behind this head. They stay for new elements until the list goes.
 template <class Type, class Argument>
 struct CList<Type, Argument>::Block {
     Block* older;
@@ -24,7 +24,8 @@ CList<Type, Argument>::CList(int blockSize) : blockSize_(blockSize > 0 ? blockSi
 
 template <class Type, class Argument>
 CList<Type, Argument>::~CList() {
-    RemoveAll();
+    while (blocks_)
+        ::operator delete(std::exchange(blocks_, blocks_->older));
 }
 
 template <class Type, class Argument>
@@ -140,10 +141,8 @@ void CList<Type, Argument>::RemoveAt(POSITION position) {
 
 template <class Type, class Argument>
 void CList<Type, Argument>::RemoveAll() {
-    head_ = tail_ = free_ = nullptr;
-    count_ = 0;
-    while (blocks_)
-        ::operator delete(std::exchange(blocks_, blocks_->older));
+    while (head_)
+        Unlink(head_);
 }
 
 // A node that is in the list is what its neighbour, or the list's head, points at.
@@ -185,10 +184,7 @@ void CList<Type, Argument>::AddBlock() {
 
 template <class Type, class Argument>
 void CList<Type, Argument>::Unlink(POSITION position) {
-    if (--count_ == 0) {
-        RemoveAll();
-        return;
-    }
+    --count_;
     (position->previous ? position->previous->next : head_) = position->next;
     (position->next ? position->next->previous : tail_) = position->previous;
     position->previous = position; // its own neighbour, which points elsewhere: seen by Checked

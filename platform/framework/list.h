@@ -18,9 +18,9 @@ using POSITION = kota::ListNode*;
 // A doubly linked list of values, its nodes allocated in blocks. Compiled in the platform alone, for the
 // element types that the system uses: CObject* (as CObList) and int.
 //
-// A null position raises the invalid-argument failure in every operation that takes one, and so does a
-// position whose neighbours show that it is no longer, or never was, in this list. Taking from an empty
-// list raises it too.
+// A null position raises the invalid-argument failure in every operation that takes one, and so does the
+// position of an element that was removed, for as long as no new element took its room. Taking from an empty
+// list raises it too. A position of another list is the caller's mistake, and mostly not seen.
 template <class Type, class Argument>
 class KOTA_API CList : public CObject {
 public:

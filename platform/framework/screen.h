@@ -28,7 +28,7 @@ public:
     // Shows the box, waits for the user, and gives the button pressed (IDOK, IDYES, ...).
     virtual int showMessageBox(const MessageBoxRequest& request) = 0;
     // Asks for the name to save a document under; `proposal` is what the user may just accept. None when
-    // the user changed their mind.
+    // the user changed their mind. The document may write under another extension than the name's.
     virtual std::optional<CString> askSaveName(const CString& proposal) = 0;
 };
 

@@ -23,6 +23,8 @@ ScriptedScreen::ScriptedScreen(std::function<void(const std::string&)> fail) : f
 int ScriptedScreen::showMessageBox(const MessageBoxRequest& request) {
     constexpr int cancel = 2;
     boxes_.push_back(request);
+    if (onBox)
+        onBox();
     const auto button = takeFirst(boxAnswers_);
     if (!button)
         fail_("a message box that the script has no answer for: " + std::string(request.text.View()));

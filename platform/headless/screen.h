@@ -24,6 +24,9 @@ public:
     void answerBox(int button) { boxAnswers_.push_back(button); }
     void answerSaveName(std::optional<CString> name) { nameAnswers_.push_back(std::move(name)); }
 
+    // What happens while a box stands open, before it is answered: other programs, other windows.
+    std::function<void()> onBox;
+
     // All boxes shown so far, in their order.
     const std::vector<MessageBoxRequest>& boxes() const { return boxes_; }
     // Whether answers stand ready that nothing asked for.

@@ -216,6 +216,8 @@ Cell Scanner::longNumber(const char* start) {
     const auto [stop, error] = std::from_chars(start, end_, value);
     if (error == std::errc::invalid_argument)
         fail(aValue, start);
+    if (*stop == 'e' || *stop == 'E')
+        fail("digits behind the exponent's 'e'", start);
     if (std::all_of(start, stop, [](char c) { return c == '-' || isDigit(c); }))
         fail("a whole number from -2147483648 to 2147483647, or a number with a point", start);
     if (error == std::errc::result_out_of_range)

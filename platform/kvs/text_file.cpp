@@ -4,6 +4,7 @@
 #include <cstdio>
 #include <filesystem>
 #include <system_error>
+#include <vector>
 
 namespace kota::kvs {
 
@@ -36,6 +37,11 @@ int writeFile(const fs::path& path, const char* mode, std::span<const std::strin
         if (std::fwrite(piece.data(), 1, piece.size(), file.get()) != piece.size())
             return errno;
     return std::fclose(file.release()) == 0 ? 0 : errno;
+}
+
+bool endsWithLineFeed(const fs::path& path) {
+    const OpenFile file(std::fopen(path.string().c_str(), "rb"));
+    return file && std::fseek(file.get(), -1, SEEK_END) == 0 && std::fgetc(file.get()) == '\n';
 }
 
 // Writes a new file beside `path` and puts it in its place when it is whole. False when there can be no file
@@ -99,7 +105,10 @@ std::string appendText(const char* path, std::span<const std::string_view> piece
     std::string error;
     if ((!exists || (regular && oldSize == 0)) && replaceWhole(path, pieces, error))
         return error;
-    const int number = writeFile(path, "ab", pieces);
+    std::vector<std::string_view> lines(pieces.begin(), pieces.end());
+    if (oldSize > 0 && !endsWithLineFeed(path))
+        lines.insert(lines.begin(), "\n");
+    const int number = writeFile(path, "ab", lines);
     if (number == 0)
         return {};
     if (regular)

@@ -159,6 +159,18 @@ TEST_F(OpeningADocument, WithASyntaxErrorAndSavingItOverwritesTheFaultyFile) {
     EXPECT_THAT(folder.read("faulty.AD31"), EndsWith("  section K32DispersList {\n  }\n}\n"));
 }
 
+TEST_F(OpeningADocument, CanBeDoneAnewByItsOwnPath) {
+    const std::string path = folder.write("a.ad31", "target KOTA0_AD {\n}\n");
+    document.OnOpenDocument(path.c_str());
+    document.SetPathName(path.c_str());
+
+    EXPECT_EQ(document.OnOpenDocument(document.filePath), 1);
+    document.SetPathName(document.GetPathName());
+
+    EXPECT_EQ(document.filePath, path.c_str());
+    EXPECT_EQ(document.GetTitle(), "a.ad31");
+}
+
 TEST_F(OpeningADocument, CanBeDoneAfterAFaultyFile) {
     session.screen().answerBox(IDOK);
     document.OnOpenDocument(folder.write("faulty.ad31", faultyFile).c_str());

@@ -3,6 +3,8 @@
 
 #include <gmock/gmock.h>
 
+#include <memory>
+
 using namespace kota::test;
 using testing::ElementsAre;
 using testing::IsEmpty;
@@ -49,6 +51,16 @@ TEST_F(UpdatingAll, PassesAnyHintOn) {
     document.UpdateAll(&third, 0, nullptr);
 
     EXPECT_THAT(other.hints(), ElementsAre(-5, 0));
+}
+
+TEST_F(UpdatingAll, SurvivesASenderThatAnotherViewCloses) {
+    auto doomed = std::make_unique<RecordingView>(document);
+    other.onUpdate = [&](LPARAM) { doomed.reset(); };
+
+    document.UpdateAll(doomed.get(), 2, nullptr);
+
+    EXPECT_EQ(doomed, nullptr);
+    EXPECT_EQ(CWnd::GetFocus(), nullptr);
 }
 
 TEST_F(UpdatingAll, GivesTheSenderTheFocusAfterTheOthersWereTold) {

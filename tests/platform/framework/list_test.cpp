@@ -107,6 +107,26 @@ TEST(List, ARemovedPositionIsTheInvalidArgumentFailure) {
     EXPECT_EQ(valuesOf(list), std::vector{3});
 }
 
+TEST(List, TheRemovedPositionOfTheLastElementIsTheInvalidArgumentFailure) {
+    CList<int, int> list;
+    const POSITION only = list.AddTail(1);
+    list.RemoveAt(only);
+
+    EXPECT_THROW(list.GetAt(only), CInvalidArgException);
+    EXPECT_THROW(list.RemoveAt(only), CInvalidArgException);
+    EXPECT_TRUE(list.IsEmpty());
+}
+
+TEST(List, PositionsOfAnEmptiedListAreTheInvalidArgumentFailure) {
+    CList<int, int> list;
+    const POSITION first = list.AddTail(1);
+    const POSITION second = list.AddTail(2);
+    list.RemoveAll();
+
+    EXPECT_THROW(list.GetAt(first), CInvalidArgException);
+    EXPECT_THROW(list.GetAt(second), CInvalidArgException);
+}
+
 TEST(List, AnotherListsHeadIsTheInvalidArgumentFailure) {
     CList<int, int> list;
     CList<int, int> other;

@@ -44,6 +44,14 @@ TEST_F(Append, AddsToTheEndOfAFile) {
     EXPECT_THAT(names(), ElementsAre("f.ad31"));
 }
 
+TEST_F(Append, BeginsALineOfItsOwn) {
+    folder.write("f.ad31", "# a comment without a line's end");
+
+    EXPECT_EQ(TargetFile("T").append(path()), 1);
+
+    EXPECT_EQ(folder.read("f.ad31"), "# a comment without a line's end\ntarget T {\n}\n");
+}
+
 TEST_F(Append, OfTheSameFileTwiceGivesItsTextTwice) {
     const TargetFile target("T");
 
