@@ -97,7 +97,7 @@ std::vector<PlainDecay> readJson(const std::string& path, JsonForm form) {
     rapidjson::FileReadStream stream(file.get(), buffer.data(), buffer.size());
     // Never freed: it goes with the process, as the other side's records do.
     auto& json = *new rapidjson::Document;
-    json.ParseStream(stream);
+    json.ParseStream<rapidjson::kParseFullPrecisionFlag>(stream); // else the last bits differ
     if (json.HasParseError() || !json.IsArray())
         throw std::runtime_error("not the JSON that was written");
     std::vector<PlainDecay> records;
