@@ -5,6 +5,14 @@
 
 add_custom_target(check_headers COMMENT "Every header compiles alone")
 
+# The builds of the presets share those directories, so that what one has compiled the compiler cache can give
+# to another.
+cmake_path(GET CMAKE_BINARY_DIR PARENT_PATH KOTA_LEVELS)
+if(NOT KOTA_LEVELS STREQUAL ${CMAKE_SOURCE_DIR}/build)
+    set(KOTA_LEVELS ${CMAKE_BINARY_DIR})
+endif()
+string(APPEND KOTA_LEVELS /levels)
+
 # kota_level(NAME FOLDER dir SOURCES file... HEADERS file... MAY_USE level...)
 #
 # NAME becomes an object library of the sources of FOLDER (paths relative to it). MAY_USE names the levels
@@ -12,7 +20,7 @@ add_custom_target(check_headers COMMENT "Every header compiles alone")
 function(kota_level NAME)
     cmake_parse_arguments(LEVEL "" "FOLDER" "SOURCES;HEADERS;MAY_USE" ${ARGN})
     set(source_dir ${CMAKE_SOURCE_DIR}/${LEVEL_FOLDER})
-    set(view ${CMAKE_BINARY_DIR}/levels/${NAME})
+    set(view ${KOTA_LEVELS}/${NAME})
     list(TRANSFORM LEVEL_SOURCES PREPEND ${source_dir}/)
 
     foreach(header IN LISTS LEVEL_HEADERS)

@@ -32,13 +32,13 @@ CKota0_adDoc::CKota0_adDoc() = default;
 CKota0_adDoc::~CKota0_adDoc() = default;
 
 // The lists in the order in which the document cleans them.
-CKota0_adDoc::Lists<12> CKota0_adDoc::AllLists() {
+std::array<CGenList*, 12> CKota0_adDoc::AllLists() {
     return {&initList,    &initStraList, &nonCohesList, &decayList, &dispersList,  &k32DispersList,
             &iceDataList, &globalList,   &compList,     &boundList, &k32BoundList, &layerList};
 }
 
 // The lists that the file holds, in file order: a boundary lives only while the document is open.
-CKota0_adDoc::Lists<10> CKota0_adDoc::SavedLists() {
+std::array<CGenList*, 10> CKota0_adDoc::SavedLists() {
     return {&initList,    &initStraList, &nonCohesList, &decayList, &dispersList,
             &iceDataList, &globalList,   &compList,     &layerList, &k32DispersList};
 }

@@ -72,10 +72,8 @@ protected:
     CString WrittenPathName(const char* path) const override;
 
 private:
-    template <std::size_t Count>
-    using Lists = std::array<CGenList*, Count>;
-    Lists<12> AllLists();
-    Lists<10> SavedLists();
+    std::array<CGenList*, 12> AllLists();
+    std::array<CGenList*, 10> SavedLists();
 };
 
 // What the document tells its views by a hint of UpdateAllViews.

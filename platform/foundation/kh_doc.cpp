@@ -38,12 +38,6 @@ IMPLEMENT_DYNAMIC(CKhDoc, CDocument, kota::platformModule)
 CKhDoc::CKhDoc() = default;
 CKhDoc::~CKhDoc() = default;
 
-BOOL CKhDoc::OnNewDocument() {
-    return CDocument::OnNewDocument();
-}
-void CKhDoc::SetModifiedFlag(BOOL modified) {
-    CDocument::SetModifiedFlag(modified);
-}
 CString CKhDoc::WrittenPathName(const char* path) const {
     return path;
 }

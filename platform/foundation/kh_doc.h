@@ -9,11 +9,9 @@ public:
     CKhDoc();
     ~CKhDoc() override;
 
-    BOOL OnNewDocument() override;
     // Empties the document for what the file holds; reading it is left to the derived class. 0 when the file
     // cannot be opened, after telling the user why: then the document is as it was.
     BOOL OnOpenDocument(const char* path) override;
-    void SetModifiedFlag(BOOL modified = TRUE) override;
 
     // Saves through OnSaveDocument, and so that nothing is lost: the version before is kept as NAME~ beside
     // the file, whose folder must be writable for that. When the file library could not write, the old file

@@ -2,7 +2,7 @@
 
 #include <cstddef>
 #include <functional>
-#include <vector>
+#include <memory>
 
 namespace kota::kvs {
 
@@ -25,7 +25,8 @@ private:
     bool readMore();
 
     ByteSource source_;
-    std::vector<char> buffer_;
+    std::unique_ptr<char[]> buffer_;
+    std::size_t size_;
     char* end_;
     bool exhausted_ = false;
 };
