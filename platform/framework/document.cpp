@@ -1,23 +1,30 @@
 #include "platform/framework/document.h"
 
+#include "platform/framework/frame.h"
 #include "platform/framework/message_box.h"
 #include "platform/framework/path.h"
+#include "platform/framework/template.h"
 #include "platform/framework/view.h"
 
 #include <algorithm>
+#include <utility>
 
 IMPLEMENT_DYNAMIC(CDocument, CCmdTarget, kota::platformModule)
-IMPLEMENT_DYNAMIC(CView, CWnd, kota::platformModule)
 
 CDocument::CDocument() = default;
 
 CDocument::~CDocument() {
-    while (!views_.empty())
-        RemoveView(views_.back());
+    for (CView* view : std::exchange(views_, {}))
+        view->document_ = nullptr;
+    if (docTemplate_)
+        docTemplate_->RemoveDocument(this);
 }
 
 void CDocument::SetTitle(const char* title) {
     title_ = title;
+    for (const CView* view : views_)
+        if (CFrameWnd* const frame = view->GetParentFrame())
+            frame->SetWindowText(title);
 }
 
 void CDocument::SetPathName(const char* path) {
@@ -41,8 +48,24 @@ void CDocument::AddView(CView* view) {
 }
 
 void CDocument::RemoveView(CView* view) {
-    if (std::erase(views_, view) > 0)
+    if (std::erase(views_, view) == 0)
+        return;
+    view->document_ = nullptr;
+    if (views_.empty() && docTemplate_)
+        OnCloseDocument();
+}
+
+void CDocument::OnCloseDocument() {
+    for (CView* view : std::exchange(views_, {}))
         view->document_ = nullptr;
+    DeleteContents();
+    delete this;
+}
+
+BOOL CDocument::CanCloseFrame(CFrameWnd* frame) {
+    const bool another = std::ranges::any_of(
+        views_, [&](const CView* view) { return view->GetParentFrame() && view->GetParentFrame() != frame; });
+    return another || SaveModified();
 }
 
 void CDocument::UpdateAllViews(CView* sender, LPARAM hint, CObject* hintObject) {
@@ -64,6 +87,31 @@ BOOL CDocument::OnNewDocument() {
     return TRUE;
 }
 
+BOOL CDocument::OnCmdMsg(UINT id, int notification) {
+    static constexpr auto commands = kota::commandMap<CDocument>({
+        {ID_FILE_CLOSE, 0, &CDocument::OnFileClose},
+        {ID_FILE_SAVE, 0, &CDocument::OnFileSave},
+        {ID_FILE_SAVE_AS, 0, &CDocument::OnFileSaveAs},
+    });
+    return kota::runCommand(*this, commands, id, notification) || CCmdTarget::OnCmdMsg(id, notification);
+}
+
+void CDocument::OnFileSave() {
+    DoSave(pathName_);
+}
+void CDocument::OnFileSaveAs() {
+    DoSave("");
+}
+
+void CDocument::OnFileClose() {
+    if (!SaveModified())
+        return;
+    const std::vector<CView*> present = views_;
+    for (CView* view : present)
+        if (CFrameWnd* const frame = view->GetParentFrame())
+            frame->DestroyWindow();
+}
+
 BOOL CDocument::SaveModified() {
     if (!IsModified())
         return TRUE;
@@ -79,12 +127,3 @@ BOOL CDocument::SaveModified() {
         return FALSE;
     }
 }
-
-CView::CView() = default;
-
-CView::~CView() {
-    if (document_)
-        document_->RemoveView(this);
-}
-
-void CView::OnUpdate(CView* /*sender*/, LPARAM /*hint*/, CObject* /*hintObject*/) {}

@@ -5,6 +5,8 @@
 
 #include <vector>
 
+class CDocTemplate;
+class CFrameWnd;
 class CArchive; // only ever named: no document of the system goes through an archive
 class CView;
 
@@ -48,10 +50,26 @@ public:
 
     // Saves under `path`, or under a name asked for when it is empty. 1 done.
     virtual BOOL DoSave(const char* path) = 0;
+    // Ends a document that a template made: empties and deletes it. The last view that leaves it does this.
+    virtual void OnCloseDocument();
+    // Whether a frame of the document may be closed: not when it is the last one and the user, asked about
+    // changes, wants to stay.
+    virtual BOOL CanCloseFrame(CFrameWnd* frame);
+    // The template that made the document; null when somebody else did, who owns it.
+    CDocTemplate* GetDocTemplate() const { return docTemplate_; }
+    // Saves under the document's own name, or asks for another one: the commands of the File menu.
+    BOOL OnCmdMsg(UINT id, int notification) override;
+
     // Asks whether changes shall be saved, and saves them if so. 1: the document may be closed.
     virtual BOOL SaveModified();
 
 private:
+    friend class CDocTemplate;
+    void OnFileSave();
+    void OnFileSaveAs();
+    void OnFileClose();
+
+    CDocTemplate* docTemplate_ = nullptr;
     CString title_;
     CString pathName_;
     std::vector<CView*> views_;

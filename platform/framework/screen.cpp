@@ -11,6 +11,9 @@ Screen* theScreen = nullptr;
 Screen::Screen() = default;
 Screen::~Screen() = default;
 
+void Screen::windowsChanged(std::span<const WindowChange> /*changes*/) {}
+void Screen::changesPending() {}
+
 Screen* attachScreen(Screen* screen) {
     return std::exchange(theScreen, screen);
 }

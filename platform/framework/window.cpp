@@ -1,32 +1,16 @@
 #include "platform/framework/window.h"
 
-#include "platform/framework/exception.h"
+#include "platform/framework/frame.h"
+#include "platform/framework/guard.h"
 #include "platform/framework/message_box.h"
+#include "platform/framework/turn.h"
+#include "platform/framework/window_registry.h"
 
 #include <string>
 #include <unordered_map>
+#include <utility>
 
-namespace {
-
-struct Windows {
-    std::unordered_map<HWND, CWnd*> alive;
-    std::uintptr_t lastHandle = 0;
-    HWND focus = nullptr;
-    std::unordered_map<std::string, UINT> registeredMessages;
-};
-
-Windows& windows() {
-    static Windows all;
-    return all;
-}
-
-} // namespace
-
-IMPLEMENT_DYNAMIC(CCmdTarget, CObject, kota::platformModule)
 IMPLEMENT_DYNAMIC(CWnd, CCmdTarget, kota::platformModule)
-
-CCmdTarget::CCmdTarget() = default;
-CCmdTarget::~CCmdTarget() = default;
 
 CWnd::CWnd() = default;
 
@@ -34,82 +18,279 @@ CWnd::~CWnd() {
     CWnd::DestroyWindow();
 }
 
-BOOL CWnd::Create() {
+BOOL CWnd::Create(const kota::WindowSetup& setup) {
     if (handle_)
         return FALSE;
-    handle_ = reinterpret_cast<HWND>(++windows().lastHandle);
-    windows().alive.emplace(handle_, this);
+    handle_ = kota::registerWindow(setup, this);
     return TRUE;
+}
+
+BOOL CWnd::SubclassDlgItem(UINT id, CWnd* dialog) {
+    const CWnd* const control = dialog && !handle_ ? dialog->GetDlgItem(id) : nullptr;
+    if (!control || control->GetRuntimeClass() != RUNTIME_CLASS(CWnd))
+        return FALSE;
+    handle_ = control->handle_;
+    kota::releaseWindow(handle_, this);
+    return TRUE;
+}
+
+HWND CWnd::Detach() {
+    if (kota::WindowState* const state = MutableState(); state && state->object == this)
+        state->object = nullptr;
+    return std::exchange(handle_, nullptr);
 }
 
 BOOL CWnd::DestroyWindow() {
-    if (!handle_)
+    const kota::WindowState* const state = State();
+    if (!state)
         return FALSE;
-    if (windows().focus == handle_)
-        windows().focus = nullptr;
-    windows().alive.erase(handle_);
-    handle_ = nullptr;
+    while (!state->children.empty())
+        if (CWnd* child = FromHandle(state->children.back()))
+            child->DestroyWindow();
+    kota::forgetFocus(handle_);
+    const HWND handle = std::exchange(handle_, nullptr);
+    kota::unregisterWindow(handle);
+    PostNcDestroy();
     return TRUE;
 }
 
+void CWnd::PostNcDestroy() {}
+
 CWnd* CWnd::FromHandle(HWND handle) {
-    const auto found = windows().alive.find(handle);
-    return found == windows().alive.end() ? nullptr : found->second;
+    const kota::WindowState* const state = kota::windowState(handle);
+    if (!state)
+        return nullptr;
+    if (state->object)
+        return state->object;
+    auto plain = std::make_unique<CWnd>();
+    plain->handle_ = handle;
+    return kota::adoptWindow(handle, std::move(plain));
+}
+
+const kota::WindowState* CWnd::State() const {
+    return kota::windowState(handle_);
+}
+kota::WindowState* CWnd::MutableState() const {
+    return kota::windowState(handle_);
+}
+
+CWnd* CWnd::GetParent() const {
+    const kota::WindowState* const state = State();
+    return state ? FromHandle(state->setup.parent) : nullptr;
+}
+
+UINT CWnd::GetDlgCtrlID() const {
+    const kota::WindowState* const state = State();
+    return state ? state->setup.id : 0;
+}
+
+CWnd* CWnd::GetDlgItem(UINT id) const {
+    const kota::WindowState* const state = State();
+    if (!state || id == 0)
+        return nullptr;
+    for (const HWND handle : state->children) {
+        CWnd* const child = FromHandle(handle);
+        if (child->GetDlgCtrlID() == id)
+            return child;
+        if (CWnd* const deeper = child->GetDlgItem(id))
+            return deeper;
+    }
+    return nullptr;
+}
+
+bool CWnd::IsChild(const CWnd* window) const {
+    for (const CWnd* around = window ? window->GetParent() : nullptr; around; around = around->GetParent())
+        if (around == this)
+            return true;
+    return false;
+}
+
+CFrameWnd* CWnd::GetParentFrame() const {
+    for (CWnd* around = GetParent(); around; around = around->GetParent())
+        if (around->IsKindOf(RUNTIME_CLASS(CFrameWnd)))
+            return static_cast<CFrameWnd*>(around);
+    return nullptr;
+}
+
+void CWnd::SetWindowText(const char* text) {
+    kota::WindowState* const state = MutableState();
+    if (!state)
+        return;
+    state->text = text;
+    kota::noteChange(handle_, kota::Change::Text);
+    if (state->setup.kind == kota::WindowKind::Edit)
+        NotifyParent(EN_CHANGE);
+}
+
+CString CWnd::GetWindowText() const {
+    const kota::WindowState* const state = State();
+    return state ? state->text : CString();
+}
+
+BOOL CWnd::EnableWindow(BOOL enable) {
+    kota::WindowState* const state = MutableState();
+    if (!state)
+        return FALSE;
+    const bool wasDisabled = !std::exchange(state->enabled, enable != 0);
+    kota::noteChange(handle_, kota::Change::State);
+    return wasDisabled;
+}
+
+BOOL CWnd::IsWindowEnabled() const {
+    if (!State())
+        return FALSE;
+    for (const CWnd* window = this; window; window = window->GetParent())
+        if (!window->State()->enabled)
+            return FALSE;
+    return TRUE;
+}
+
+void CWnd::ShowWindow(BOOL show) {
+    if (kota::WindowState* const state = MutableState()) {
+        state->visible = show != 0;
+        kota::noteChange(handle_, kota::Change::State);
+    }
+}
+
+BOOL CWnd::IsWindowVisible() const {
+    if (!State())
+        return FALSE;
+    for (const CWnd* window = this; window; window = window->GetParent())
+        if (!window->State()->visible)
+            return FALSE;
+    return TRUE;
+}
+
+void CWnd::SetCheck(BOOL checked) {
+    if (kota::WindowState* const state = MutableState()) {
+        state->checked = checked != 0;
+        kota::noteChange(handle_, kota::Change::State);
+    }
+}
+
+BOOL CWnd::GetCheck() const {
+    const kota::WindowState* const state = State();
+    return state && state->checked;
+}
+
+void CWnd::SetToolTip(const CString& text) {
+    if (kota::WindowState* const state = MutableState()) {
+        state->toolTip = text;
+        kota::noteChange(handle_, kota::Change::Text);
+    }
+}
+
+CRect CWnd::GetWindowRect() const {
+    const kota::WindowState* const state = State();
+    return state ? state->rect : CRect();
+}
+
+void CWnd::SetWindowRect(const CRect& rect) {
+    if (kota::WindowState* const state = MutableState())
+        state->rect = rect;
+}
+
+void CWnd::BringWindowToTop() {
+    if (handle_)
+        kota::noteChange(handle_, kota::Change::Raised);
+}
+
+BOOL CWnd::SetForegroundWindow() {
+    BringWindowToTop();
+    return handle_ != nullptr;
+}
+
+CMenu* CWnd::GetMenu() {
+    return nullptr;
+}
+
+void CWnd::DrawMenuBar() {
+    if (handle_)
+        kota::noteChange(handle_, kota::Change::Menu);
 }
 
 LRESULT CWnd::SendMessage(UINT message, WPARAM wParam, LPARAM lParam) {
     return ::SendMessage(handle_, message, wParam, lParam);
 }
-
-CWnd* CWnd::SetFocus() {
-    return FromHandle(::SetFocus(handle_));
-}
-CWnd* CWnd::GetFocus() {
-    return FromHandle(::GetFocus());
+BOOL CWnd::PostMessage(UINT message, WPARAM wParam, LPARAM lParam) {
+    return ::PostMessage(handle_, message, wParam, lParam);
 }
 
-LRESULT CWnd::WindowProc(UINT /*message*/, WPARAM /*wParam*/, LPARAM /*lParam*/) {
-    return 0;
+int CWnd::MessageBox(const char* text, const char* caption, UINT type) {
+    return ::MessageBox(handle_, text, caption, type);
 }
 
-bool IsWindow(HWND handle) {
-    return CWnd::FromHandle(handle) != nullptr;
+BOOL CWnd::PreTranslateMessage(MSG* /*message*/) {
+    return FALSE;
+}
+bool CWnd::LetFocusGo() {
+    return true;
 }
 
-LRESULT SendMessage(HWND handle, UINT message, WPARAM wParam, LPARAM lParam) {
-    CWnd* window = CWnd::FromHandle(handle);
-    if (!window)
+void CWnd::NotifyParent(int notification) {
+    const kota::WindowState* const state = State();
+    if (state)
+        ::SendMessage(kota::dialogAround(handle_), WM_COMMAND, commandParam(state->setup.id, notification),
+                      reinterpret_cast<LPARAM>(handle_));
+}
+
+LRESULT CWnd::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+    if (message == WM_COMMAND)
+        return OnCmdMsg(commandId(wParam), commandNotification(wParam));
+    return DefWindowProc(message, wParam, lParam);
+}
+
+LRESULT CWnd::DefWindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+    kota::WindowState* const state = MutableState();
+    if (!state)
         return 0;
-    try {
-        return window->WindowProc(message, wParam, lParam);
-    } catch (const CInvalidArgException& failure) {
-        CString text;
-        text.Format("An operation was given an invalid argument (%s).", failure.what());
-        AfxMessageBox(text);
+    const bool edit = state->setup.kind == kota::WindowKind::Edit;
+    switch (message) {
+    case WM_SETFOCUS:
+    case WM_KILLFOCUS:
+        if (edit)
+            NotifyParent(message == WM_SETFOCUS ? EN_SETFOCUS : EN_KILLFOCUS);
+        return 0;
+    case WM_HELP: // goes outward until somebody knows help
+        return ::SendMessage(state->setup.parent, message, wParam, lParam);
+    case EM_LIMITTEXT:
+        state->textLimit = static_cast<int>(wParam);
+        return 0;
+    case CB_GETCURSEL:
+        return state->chosen;
+    case CB_SETCURSEL: {
+        const auto entry = static_cast<std::intptr_t>(wParam);
+        const bool exists = entry >= 0 && entry < std::ssize(state->choices);
+        state->chosen = exists ? static_cast<int>(entry) : -1;
+        kota::noteChange(handle_, kota::Change::Choices);
+        return state->chosen;
+    }
+    default:
         return 0;
     }
 }
 
-HWND SetFocus(HWND handle) {
-    const HWND previous = windows().focus;
-    if (handle == previous || (handle && !IsWindow(handle)))
-        return previous;
-    windows().focus = nullptr;
-    SendMessage(previous, WM_KILLFOCUS, reinterpret_cast<WPARAM>(handle), 0);
-    // The old holder may have closed the new one, or given the focus elsewhere, on its way out.
-    if (windows().focus || !IsWindow(handle))
-        return previous;
-    windows().focus = handle;
-    SendMessage(handle, WM_SETFOCUS, reinterpret_cast<WPARAM>(previous), 0);
-    return previous;
+bool IsWindow(HWND handle) {
+    return kota::windowState(handle) != nullptr;
 }
 
-HWND GetFocus() {
-    return windows().focus;
+LRESULT SendMessage(HWND handle, UINT message, WPARAM wParam, LPARAM lParam) {
+    CWnd* const window = CWnd::FromHandle(handle);
+    LRESULT result = 0;
+    if (window && !kota::guarded([&] { result = window->WindowProc(message, wParam, lParam); }))
+        result = 0;
+    return result;
+}
+
+BOOL PostMessage(HWND handle, UINT message, WPARAM wParam, LPARAM lParam) {
+    if (!IsWindow(handle))
+        return FALSE;
+    kota::postMessage({handle, message, wParam, lParam});
+    return TRUE;
 }
 
 UINT RegisterWindowMessage(const char* name) {
-    auto& messages = windows().registeredMessages;
-    const UINT next = 0xC000 + static_cast<UINT>(messages.size());
-    return messages.try_emplace(name ? name : "", next).first->second;
+    static std::unordered_map<std::string, UINT> registered;
+    const UINT next = 0xC000 + static_cast<UINT>(registered.size());
+    return registered.try_emplace(name ? name : "", next).first->second;
 }

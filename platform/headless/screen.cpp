@@ -1,5 +1,8 @@
 #include "platform/headless/screen.h"
 
+#include "platform/framework/dialog.h"
+#include "platform/framework/message_box.h"
+
 #include <string>
 #include <utility>
 
@@ -21,14 +24,13 @@ std::optional<Answer> takeFirst(std::deque<Answer>& answers) {
 ScriptedScreen::ScriptedScreen(std::function<void(const std::string&)> fail) : fail_(std::move(fail)) {}
 
 int ScriptedScreen::showMessageBox(const MessageBoxRequest& request) {
-    constexpr int cancel = 2;
     boxes_.push_back(request);
     if (onBox)
         onBox();
     const auto button = takeFirst(boxAnswers_);
     if (!button)
         fail_("a message box that the script has no answer for: " + std::string(request.text.View()));
-    return button.value_or(cancel);
+    return button.value_or(IDCANCEL);
 }
 
 std::optional<CString> ScriptedScreen::askSaveName(const CString& proposal) {
@@ -37,6 +39,16 @@ std::optional<CString> ScriptedScreen::askSaveName(const CString& proposal) {
         fail_("a question for a file name that the script has no answer for: " +
               std::string(proposal.View()));
     return name.value_or(std::nullopt);
+}
+
+void ScriptedScreen::showDialog(CDialog& dialog) {
+    const auto user = takeFirst(dialogUsers_);
+    if (!user)
+        fail_("a dialog that the script has no answer for: " + std::string(dialog.GetWindowText().View()));
+    else
+        (*user)(dialog);
+    if (!dialog.IsEnded())
+        dialog.EndDialog(IDCANCEL);
 }
 
 } // namespace kota::headless

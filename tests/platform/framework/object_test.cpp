@@ -10,12 +10,12 @@ namespace {
 constexpr kota::StringResource strings[] = {{1, "one"}, {7, "seven"}};
 
 const kota::Module& thisModule() {
-    static const kota::Module module("this", strings);
+    static const kota::Module module("this", {.strings = strings});
     return module;
 }
 
 const kota::Module& otherModule() {
-    static const kota::Module module("other", {});
+    static const kota::Module module("other", kota::Resources{});
     return module;
 }
 

@@ -1,0 +1,86 @@
+#include "platform/framework/document.h"
+#include "platform/framework/frame.h"
+#include "platform/framework/template.h"
+#include "platform/framework/turn.h"
+
+IMPLEMENT_DYNCREATE(CMDIChildWnd, CFrameWnd, kota::platformModule)
+IMPLEMENT_DYNAMIC(CMDIFrameWnd, CFrameWnd, kota::platformModule)
+
+namespace {
+
+CMDIFrameWnd* mainFrameOf(const CWnd& child) {
+    CWnd* const parent = child.GetParent();
+    return parent && parent->IsKindOf(RUNTIME_CLASS(CMDIFrameWnd)) ? static_cast<CMDIFrameWnd*>(parent)
+                                                                   : nullptr;
+}
+
+} // namespace
+
+CMDIChildWnd::CMDIChildWnd() = default;
+CMDIChildWnd::~CMDIChildWnd() = default;
+
+void CMDIChildWnd::ActivateFrame() {
+    if (CMDIFrameWnd* const mainFrame = mainFrameOf(*this))
+        mainFrame->MDIActivate(this);
+    else
+        CFrameWnd::ActivateFrame();
+}
+
+BOOL CMDIChildWnd::DestroyWindow() {
+    CMDIFrameWnd* const mainFrame = mainFrameOf(*this);
+    const bool wasActive = mainFrame && mainFrame->MDIGetActive() == this;
+    if (wasActive)
+        mainFrame->MDIActivate(nullptr);
+    const BOOL destroyed = CFrameWnd::DestroyWindow();
+    if (wasActive && !mainFrame->Children().empty())
+        mainFrame->MDIActivate(mainFrame->Children().back());
+    return destroyed;
+}
+
+CMDIFrameWnd::CMDIFrameWnd() = default;
+CMDIFrameWnd::~CMDIFrameWnd() = default;
+
+CMDIChildWnd* CMDIFrameWnd::MDIGetActive() const {
+    return static_cast<CMDIChildWnd*>(FromHandle(activeChild_));
+}
+
+void CMDIFrameWnd::MDIActivate(CMDIChildWnd* child) {
+    CMDIChildWnd* const before = MDIGetActive();
+    if (child == before)
+        return;
+    if (CView* const view = before ? before->GetActiveView() : nullptr)
+        view->OnActivateView(FALSE, view, view);
+    activeChild_ = child ? child->GetSafeHwnd() : nullptr;
+    CView* const view = child ? child->GetActiveView() : nullptr;
+    if (!view)
+        return;
+    child->BringWindowToTop();
+    view->OnActivateView(TRUE, view, view);
+    view->SetFocus();
+}
+
+std::vector<CMDIChildWnd*> CMDIFrameWnd::Children() const {
+    std::vector<CMDIChildWnd*> frames;
+    for (const HWND handle : State() ? State()->children : std::vector<HWND>())
+        if (CWnd* const child = FromHandle(handle); child->IsKindOf(RUNTIME_CLASS(CMDIChildWnd)))
+            frames.push_back(static_cast<CMDIChildWnd*>(child));
+    return frames;
+}
+
+BOOL CMDIFrameWnd::OnCmdMsg(UINT id, int notification) {
+    static constexpr auto commands =
+        kota::commandMap<CMDIFrameWnd>({{ID_WINDOW_NEW, 0, &CMDIFrameWnd::OnWindowNew}});
+    CMDIChildWnd* const child = MDIGetActive();
+    return (child && child->OnCmdMsg(id, notification)) ||
+           kota::runCommand(*this, commands, id, notification) || CFrameWnd::OnCmdMsg(id, notification);
+}
+
+void CMDIFrameWnd::OnWindowNew() {
+    CMDIChildWnd* const active = MDIGetActive();
+    CDocument* const document = active ? active->GetActiveDocument() : nullptr;
+    CDocTemplate* const docTemplate = document ? document->GetDocTemplate() : nullptr;
+    if (!docTemplate)
+        return;
+    if (CFrameWnd* const frame = docTemplate->CreateNewFrame(document, active))
+        docTemplate->InitialUpdateFrame(frame, document, TRUE);
+}

@@ -1,0 +1,187 @@
+#pragma once
+
+#include "platform/framework/window.h"
+#include "platform/grid/control.h"
+#include "platform/grid/param.h"
+#include "platform/grid/range.h"
+#include "platform/grid/style.h"
+
+#include <memory>
+#include <string_view>
+
+// Flags of SetCurrentCell.
+inline constexpr UINT GX_SCROLLINVIEW = 2; // bring the cell into view
+inline constexpr UINT GX_DISPLAYEDITWND = 8; // bring it into view and redraw at once
+inline constexpr UINT GX_KEEPFOCUS = 32; // leave the focus where it is; without it the grid takes the focus
+
+// Directions of MoveCurrentCell.
+inline constexpr int GX_UP = 1;
+inline constexpr int GX_LEFT = 2;
+inline constexpr int GX_DOWN = 3;
+inline constexpr int GX_RIGHT = 4;
+inline constexpr int GX_PAGEUP = 5;
+inline constexpr int GX_PAGEDOWN = 6;
+inline constexpr int GX_TOP = 7;
+inline constexpr int GX_BOTTOM = 8;
+inline constexpr int GX_MOSTLEFT = 9;
+inline constexpr int GX_MOSTRIGHT = 10;
+inline constexpr int GX_BOTTOMRIGHT = 11;
+inline constexpr int GX_TOPLEFT = 12;
+
+namespace kota {
+
+// What of a grid changed since a screen took the changes last.
+struct GridChanges {
+    bool layout = false;    // lines, columns, sizes, frozen or covered cells, column styles, headers
+    bool current = false;   // current cell or what is seen of the grid
+    bool selection = false;
+    bool editing = false;   // an edit began or ended, or its text was loaded anew
+    bool warned = false;    // a text was refused: see CGXGridCore::Warning
+    CGXRange cells;         // what is to be drawn anew, none if nothing
+};
+
+// Why a cell could not be left.
+struct GridWarning {
+    ROWCOL row = 0;
+    ROWCOL col = 0;
+    CString text;
+};
+
+} // namespace kota
+
+// A grid of lines and columns from 1; line 0 and column 0 are the headers. It holds the cells' values as
+// texts, the styles that are laid over one another, the current cell with its edit, and the selection. It
+// neither draws nor reads a mouse: a screen draws it (ComposeStyleRowCol, GetDisplayText, TakeChanges) and
+// hands on what the user does (platform/grid/user.h).
+class KOTA_API CGXGridCore : public CWnd {
+    DECLARE_DYNAMIC(CGXGridCore)
+public:
+    CGXGridCore();
+    ~CGXGridCore() override;
+
+    CGXGridParam* GetParam();
+    const CGXGridParam* GetParam() const;
+
+    // Lines and columns, headers not counted. New lines are blank; lines and columns taken away are
+    // forgotten, with their styles. The current cell stays where it is, even beyond the last line, and
+    // SetCurrentCell is not called. 1 done.
+    BOOL SetRowCount(ROWCOL count, UINT flags = 0);
+    BOOL SetColCount(ROWCOL count, UINT flags = 0);
+    ROWCOL GetRowCount() const;
+    ROWCOL GetColCount() const;
+    // Inserts lines in front of `row`, at the end for the line count plus 1. Beyond that: nothing, 0.
+    BOOL InsertRows(ROWCOL row, ROWCOL count);
+    // Removes the lines that exist among these. 0 when none does.
+    BOOL RemoveRows(ROWCOL first, ROWCOL last);
+
+    // In the units of the dialog; a screen scales them for its font.
+    int GetRowHeight(ROWCOL row) const;
+    int GetColWidth(ROWCOL col) const;
+    BOOL SetRowHeight(ROWCOL first, ROWCOL last, int height);
+    BOOL SetColWidth(ROWCOL first, ROWCOL last, int width);
+    // The lines (columns) that stay in view, from 1; of them the first `headers` count as headers.
+    BOOL SetFrozenRows(ROWCOL frozen, ROWCOL headers);
+    BOOL SetFrozenCols(ROWCOL frozen, ROWCOL headers);
+    ROWCOL GetFrozenRows() const;
+    ROWCOL GetFrozenCols() const;
+    // The lines (columns) from 1 that are headers although they hold ordinary cells.
+    ROWCOL GetHeaderRows() const;
+    ROWCOL GetHeaderCols() const;
+    // Makes one cell of a rectangle: the one at its top left.
+    BOOL SetCoveredCellsRowCol(ROWCOL top, ROWCOL left, ROWCOL bottom, ROWCOL right);
+    // The rectangle that covers the cell, or the cell itself.
+    CGXRange GetCoveredCellsRowCol(ROWCOL row, ROWCOL col) const;
+
+    // Lays a style over cells, whole lines, whole columns or all: what is set in it wins, its value among it.
+    // With the read-only lock on, a read-only cell (line, column) takes the value and nothing else. A cell
+    // beyond the line or column count takes nothing, and the result is 0.
+    BOOL SetStyleRange(const CGXRange& range, const CGXStyle& style);
+    // Sets the stored value. Never barred by the lock; an edit that stands open is left alone.
+    BOOL SetValueRange(const CGXRange& range, const char* text);
+    BOOL SetValueRange(const CGXRange& range, std::string_view text);
+    BOOL SetValueRange(const CGXRange& range, const CString& text);
+    BOOL SetValueRange(const CGXRange& range, int number);
+    // The shortest text that reads back to the same number.
+    BOOL SetValueRange(const CGXRange& range, double number);
+    // The text that the cell holds: its own value, or else that of its line's, its column's or the standard
+    // style; of a header what it shows. Empty for a blank and for a cell that is not there.
+    CString GetValueRowCol(ROWCOL row, ROWCOL col);
+    // The same for a cell below the header, without a copy; valid until the grid changes.
+    std::string_view CellText(ROWCOL row, ROWCOL col) const;
+    // The styles over one another, with the value.
+    virtual void ComposeStyleRowCol(ROWCOL row, ROWCOL col, CGXStyle* style) const;
+    CGXStyle& ChangeStandardStyle(const CGXStyle& style);
+
+    // Attaches a control to a control id and takes it over. The grid has those of style.h from the start.
+    BOOL RegisterControl(UINT id, std::unique_ptr<CGXControl> control);
+    // The control that the cell's style names. Its current text is that of the cell being edited.
+    CGXControl* GetControl(ROWCOL row, ROWCOL col) const;
+    // What the cell shows: the text being typed, or else the value as its control displays it.
+    CString GetDisplayText(ROWCOL row, ROWCOL col) const;
+
+    // The current cell. 0 when there is none, and then row and col are 0.
+    BOOL GetCurrentCell(ROWCOL* row, ROWCOL* col) const;
+    // Commits what is typed, and moves the current cell. (0, 0) is none. 0: a text was refused, and all is as
+    // before but for the warning. May be given the same cell, and one beyond the line count.
+    virtual BOOL SetCurrentCell(ROWCOL row, ROWCOL col, UINT flags = GX_SCROLLINVIEW);
+    // By SetCurrentCell, among the cells below the headers. 0 when it is refused.
+    BOOL MoveCurrentCell(int direction, int count = 1, BOOL update = TRUE);
+    // The column leftmost, the line topmost in view behind the frozen ones; a screen sets them.
+    ROWCOL GetLeftCol() const;
+    ROWCOL GetTopRow() const;
+    void SetLeftCol(ROWCOL col);
+    void SetTopRow(ROWCOL row);
+    // How many lines a page of the screen holds, for the keys that move by pages; 10 until a screen tells.
+    void SetPageRows(ROWCOL count);
+
+    // Whether a text that the user changed waits to be committed.
+    bool IsEditPending() const;
+    // Whether the current cell is being edited.
+    bool IsEditing() const;
+    // Takes the pending text back.
+    void CancelEdit();
+    void SetWarningText(const char* text);
+    // The last refusal; its text is empty when the edit has gone on since.
+    const kota::GridWarning& Warning() const;
+
+    void Redraw(UINT flags = 0, BOOL update = TRUE);
+    // Draws the cells anew. The control of a cell that is being edited is loaded from the stored value.
+    void RedrawRowCol(const CGXRange& range);
+    BOOL EnableGridToolTips(BOOL enable = TRUE);
+    bool HasGridToolTips() const;
+    // What a screen has to draw anew. Asking takes the changes away.
+    kota::GridChanges TakeChanges();
+
+    // Keys that the user pressed in the grid. 1: taken. The base moves the current cell by the arrow keys,
+    // Page Up and Down, Home and End, takes Escape while a cell is edited, and begins an edit by F2.
+    virtual BOOL ProcessKeys(CWnd* window, UINT message, UINT key, UINT repeat, UINT flags);
+    // Before a cell is edited; 0 refuses.
+    virtual BOOL OnStartEditing(ROWCOL row, ROWCOL col);
+    // After every change of the text of the cell being edited, and after a click changed a check box.
+    virtual void OnModifyCell(ROWCOL row, ROWCOL col);
+    // A check box was clicked; its stored value is the new one.
+    virtual void OnClickedButtonRowCol(ROWCOL row, ROWCOL col);
+    // After the selection changed by the user.
+    virtual void OnChangedSelection();
+
+    LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
+    bool LetFocusGo() override;
+
+private:
+    friend class kota_GridUser;
+    struct Data;
+    std::unique_ptr<Data> data_;
+};
+
+// The grid as a control of a dialog.
+class KOTA_API CGXGridWnd : public CGXGridCore {
+    DECLARE_DYNAMIC(CGXGridWnd)
+public:
+    CGXGridWnd();
+    ~CGXGridWnd() override;
+
+    // Prepares a grid that has just taken over its control: no lines, no columns.
+    BOOL Initialize();
+    // All is to be drawn anew.
+    void Invalidate(BOOL erase = TRUE);
+};
