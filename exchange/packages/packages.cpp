@@ -17,3 +17,12 @@ UINT communicationMessage() {
 UINT switchBoardMessage() {
     return RegisterWindowMessage("KOTAHubSwitchBoardSevice");
 }
+UINT projectMessage() {
+    return RegisterWindowMessage("KOTAHubProjectManagement");
+}
+UINT showToolbarMessage() {
+    return RegisterWindowMessage("KOTAHubShowToolbar");
+}
+UINT hideToolbarMessage() {
+    return RegisterWindowMessage("KOTAHubHideToolbar");
+}

@@ -80,6 +80,14 @@ inline constexpr WPARAM OfferRivers = 52;    // a new CObList of new items, the 
 inline constexpr WPARAM OfferLocation = 200; // a new item, or null
 } // namespace SwitchBoardCode
 
+// wParam of the tool bar messages: the tool bar's first command.
+inline constexpr WPARAM toolbarCommand = 42550;
+// wParam of "KOTAHubProjectManagement" that a view hands on; it swallows all others.
+inline constexpr WPARAM projectPassedOn = 2;
+
 // The registered messages' numbers.
 KOTA_PACKAGES_API UINT communicationMessage(); // "KOTAHubCommunicationBetweenEditors"
 KOTA_PACKAGES_API UINT switchBoardMessage();   // "KOTAHubSwitchBoardSevice"
+KOTA_PACKAGES_API UINT projectMessage();       // "KOTAHubProjectManagement", to a view
+KOTA_PACKAGES_API UINT showToolbarMessage();   // "KOTAHubShowToolbar", to the main window
+KOTA_PACKAGES_API UINT hideToolbarMessage();   // "KOTAHubHideToolbar", to the main window

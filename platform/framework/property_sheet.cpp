@@ -41,8 +41,8 @@ void CPropertySheet::AddPage(CPropertyPage* page) {
 BOOL CPropertySheet::Create(CWnd* parent, unsigned style, unsigned extendedStyle) {
     if (!CWnd::Create({.parent = parent ? parent->GetSafeHwnd() : nullptr, .kind = kota::WindowKind::Sheet}))
         return FALSE;
-    style_ = style;
-    extendedStyle_ = extendedStyle;
+    MutableState()->style = style;
+    MutableState()->extendedStyle = extendedStyle;
     MutableState()->text = caption_;
     SetWindowRect(nominalRect);
     std::vector<CString> captions;
@@ -93,10 +93,19 @@ bool CPropertySheet::LeaveActivePage() {
     CPropertyPage* const page = GetActivePage();
     if (!page)
         return true;
+    // What is pending in the control with the focus is committed first.
     CWnd* const focus = GetFocus();
-    if (focus && page->IsChild(focus) && !focus->LetFocusGo())
-        return false;
-    return page->OnKillActive() != 0;
+    const HWND holder = page->IsChild(focus) ? focus->GetSafeHwnd() : nullptr;
+    if (holder) {
+        GetTabControl()->SetFocus();
+        if (::GetFocus() == holder)
+            return false;
+    }
+    if (page->OnKillActive())
+        return true;
+    if (IsWindow(holder))
+        ::SetFocus(holder);
+    return false;
 }
 
 void CPropertySheet::ShowPage(int index) {

@@ -55,10 +55,6 @@ public:
     BOOL SetActivePage(int index);
     BOOL SetActivePage(CPropertyPage* page);
 
-    // The window's style bits as given to Create.
-    unsigned GetStyle() const { return style_; }
-    unsigned GetExStyle() const { return extendedStyle_; }
-
 private:
     bool LeaveActivePage();
     void ShowPage(int index);
@@ -67,6 +63,4 @@ private:
     std::vector<CPropertyPage*> pages_;
     int active_ = -1;
     bool changing_ = false;
-    unsigned style_ = 0;
-    unsigned extendedStyle_ = 0;
 };

@@ -180,6 +180,21 @@ void CWnd::SetToolTip(const CString& text) {
     }
 }
 
+unsigned CWnd::GetStyle() const {
+    const kota::WindowState* const state = State();
+    return state ? state->style : 0;
+}
+
+unsigned CWnd::GetExStyle() const {
+    const kota::WindowState* const state = State();
+    return state ? state->extendedStyle : 0;
+}
+
+void CWnd::ModifyStyleEx(unsigned remove, unsigned add) {
+    if (kota::WindowState* const state = MutableState())
+        state->extendedStyle = (state->extendedStyle & ~remove) | add;
+}
+
 CRect CWnd::GetWindowRect() const {
     const kota::WindowState* const state = State();
     return state ? state->rect : CRect();

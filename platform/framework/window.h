@@ -67,6 +67,9 @@ public:
     BOOL GetCheck() const;
     // What a screen shows when the pointer rests on the window; empty for nothing.
     void SetToolTip(const CString& text);
+    unsigned GetStyle() const;
+    unsigned GetExStyle() const;
+    void ModifyStyleEx(unsigned remove, unsigned add);
     CRect GetWindowRect() const;
     void SetWindowRect(const CRect& rect);
     // Asks the screen to bring the window in front of its siblings, and to the user.

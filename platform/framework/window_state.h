@@ -61,6 +61,8 @@ struct WindowState {
     CString text;
     CString label; // of edits and combo boxes: what stands in front of them
     CString toolTip;
+    unsigned style = 0;
+    unsigned extendedStyle = 0;
     CRect rect;          // in the parent; a wish, since a screen lays windows out by their contents
     bool enabled = true; // by itself: it takes input only while all windows around it do
     bool visible = true;

@@ -36,6 +36,9 @@ public:
     void SetModify(bool modified) { modified_ = modified; }
     // Takes a text of the user. False: a text of this kind cannot stand here, and nothing changed.
     virtual bool TakeText(const char* text);
+    // Takes the entry at a zero-based place of the cell's choice list. False when there is no such entry, and
+    // in a control without a list.
+    virtual bool TakeEntry(int index);
 
     // Called when the cell is left with a changed text. 0: the text is refused, after SetWarningText of the
     // grid; the cell is not left.
@@ -48,7 +51,8 @@ public:
     // Whether the list of entries stands open in front of the user.
     bool IsDroppedDown() const { return droppedDown_; }
     void SetDroppedDown(bool open) { droppedDown_ = open; }
-    // The zero-based place of the entry that is `text`, or with exact 0 begins with it; -1 when there is none.
+    // The zero-based place of the entry that is `text`, or with exact 0 begins with it; -1 when there is
+    // none.
     static int FindStringInChoiceList(const CString& text, const CString& choiceList, BOOL exact);
     // The entry at a zero-based place, empty beyond the list.
     static CString EntryOfChoiceList(int index, const CString& choiceList);
@@ -59,6 +63,8 @@ protected:
     ROWCOL Col() const { return col_; }
 
 private:
+    friend class CGXGridCore;
+
     CGXGridCore* grid_;
     UINT itemId_;
     ROWCOL row_ = 0;

@@ -8,9 +8,10 @@
 
 #include <memory>
 #include <string_view>
+#include <vector>
 
 // Flags of SetCurrentCell.
-inline constexpr UINT GX_SCROLLINVIEW = 2; // bring the cell into view
+inline constexpr UINT GX_SCROLLINVIEW = 2;   // bring the cell into view
 inline constexpr UINT GX_DISPLAYEDITWND = 8; // bring it into view and redraw at once
 inline constexpr UINT GX_KEEPFOCUS = 32; // leave the focus where it is; without it the grid takes the focus
 
@@ -32,12 +33,13 @@ namespace kota {
 
 // What of a grid changed since a screen took the changes last.
 struct GridChanges {
-    bool layout = false;    // lines, columns, sizes, frozen or covered cells, column styles, headers
-    bool current = false;   // current cell or what is seen of the grid
+    bool layout = false;  // lines, columns, sizes, frozen or covered cells, column styles, headers
+    bool current = false; // current cell, focus, or what is seen of the grid
+    bool scroll = false;  // the current cell is to be brought into view
     bool selection = false;
-    bool editing = false;   // an edit began or ended, or its text was loaded anew
-    bool warned = false;    // a text was refused: see CGXGridCore::Warning
-    CGXRange cells;         // what is to be drawn anew, none if nothing
+    bool editing = false; // an edit began or ended, or its text was loaded anew
+    bool warned = false;  // a text was refused: see CGXGridCore::Warning
+    CGXRange cells;       // what is to be drawn anew, none if nothing
 };
 
 // Why a cell could not be left.
@@ -46,6 +48,10 @@ struct GridWarning {
     ROWCOL col = 0;
     CString text;
 };
+
+namespace grid {
+class User;
+} // namespace grid
 
 } // namespace kota
 
@@ -77,6 +83,7 @@ public:
     // In the units of the dialog; a screen scales them for its font.
     int GetRowHeight(ROWCOL row) const;
     int GetColWidth(ROWCOL col) const;
+    // `last` below `first` means the first alone. 0 when none of them exists.
     BOOL SetRowHeight(ROWCOL first, ROWCOL last, int height);
     BOOL SetColWidth(ROWCOL first, ROWCOL last, int width);
     // The lines (columns) that stay in view, from 1; of them the first `headers` count as headers.
@@ -93,10 +100,12 @@ public:
     CGXRange GetCoveredCellsRowCol(ROWCOL row, ROWCOL col) const;
 
     // Lays a style over cells, whole lines, whole columns or all: what is set in it wins, its value among it.
-    // With the read-only lock on, a read-only cell (line, column) takes the value and nothing else. A cell
-    // beyond the line or column count takes nothing, and the result is 0.
+    // A line's or a column's value is that of its cells which were never given one. All means all columns
+    // that exist. With the read-only lock on, a read-only cell (line, column) takes the value and nothing
+    // else. A cell beyond the line or column count takes nothing, and the result is 0 when none exists.
     BOOL SetStyleRange(const CGXRange& range, const CGXStyle& style);
-    // Sets the stored value. Never barred by the lock; an edit that stands open is left alone.
+    // Sets the stored value; of whole lines, whole columns or all, that of the cells below the header. Never
+    // barred by the lock; an edit that stands open is left alone. 0 when no such cell exists.
     BOOL SetValueRange(const CGXRange& range, const char* text);
     BOOL SetValueRange(const CGXRange& range, std::string_view text);
     BOOL SetValueRange(const CGXRange& range, const CString& text);
@@ -106,11 +115,11 @@ public:
     // The text that the cell holds: its own value, or else that of its line's, its column's or the standard
     // style; of a header what it shows. Empty for a blank and for a cell that is not there.
     CString GetValueRowCol(ROWCOL row, ROWCOL col);
-    // The same for a cell below the header, without a copy; valid until the grid changes.
+    // The same without a copy, but for the numbers of the lines; valid until the grid changes.
     std::string_view CellText(ROWCOL row, ROWCOL col) const;
     // The styles over one another, with the value.
     virtual void ComposeStyleRowCol(ROWCOL row, ROWCOL col, CGXStyle* style) const;
-    CGXStyle& ChangeStandardStyle(const CGXStyle& style);
+    const CGXStyle& ChangeStandardStyle(const CGXStyle& style);
 
     // Attaches a control to a control id and takes it over. The grid has those of style.h from the start.
     BOOL RegisterControl(UINT id, std::unique_ptr<CGXControl> control);
@@ -119,12 +128,16 @@ public:
     // What the cell shows: the text being typed, or else the value as its control displays it.
     CString GetDisplayText(ROWCOL row, ROWCOL col) const;
 
+    // The lines that are selected as a whole, in their order.
+    void GetSelectedRows(std::vector<ROWCOL>& rows) const;
+
     // The current cell. 0 when there is none, and then row and col are 0.
     BOOL GetCurrentCell(ROWCOL* row, ROWCOL* col) const;
     // Commits what is typed, and moves the current cell. (0, 0) is none. 0: a text was refused, and all is as
     // before but for the warning. May be given the same cell, and one beyond the line count.
     virtual BOOL SetCurrentCell(ROWCOL row, ROWCOL col, UINT flags = GX_SCROLLINVIEW);
-    // By SetCurrentCell, among the cells below the headers. 0 when it is refused.
+    // By SetCurrentCell, among the cells below the headers, past those that are not enabled. Starts from the
+    // first of them when there is none. 0 when it is refused or stands at the edge already.
     BOOL MoveCurrentCell(int direction, int count = 1, BOOL update = TRUE);
     // The column leftmost, the line topmost in view behind the frozen ones; a screen sets them.
     ROWCOL GetLeftCol() const;
@@ -138,7 +151,8 @@ public:
     bool IsEditPending() const;
     // Whether the current cell is being edited.
     bool IsEditing() const;
-    // Takes the pending text back.
+    // Ends the edit and takes back the text that the user typed; OnModifyCell is called once more then, with
+    // the text from before.
     void CancelEdit();
     void SetWarningText(const char* text);
     // The last refusal; its text is empty when the edit has gone on since.
@@ -149,7 +163,8 @@ public:
     void RedrawRowCol(const CGXRange& range);
     BOOL EnableGridToolTips(BOOL enable = TRUE);
     bool HasGridToolTips() const;
-    // What a screen has to draw anew. Asking takes the changes away.
+    // What a screen has to draw anew. Asking takes the changes away. The screen is told of a change
+    // (kota::Change::Contents), and then no more until it asks.
     kota::GridChanges TakeChanges();
 
     // Keys that the user pressed in the grid. 1: taken. The base moves the current cell by the arrow keys,
@@ -159,6 +174,8 @@ public:
     virtual BOOL OnStartEditing(ROWCOL row, ROWCOL col);
     // After every change of the text of the cell being edited, and after a click changed a check box.
     virtual void OnModifyCell(ROWCOL row, ROWCOL col);
+    // The focus has come to the grid or left it.
+    virtual void OnActivateGrid(BOOL active);
     // A check box was clicked; its stored value is the new one.
     virtual void OnClickedButtonRowCol(ROWCOL row, ROWCOL col);
     // After the selection changed by the user.
@@ -168,7 +185,7 @@ public:
     bool LetFocusGo() override;
 
 private:
-    friend class kota_GridUser;
+    friend class kota::grid::User;
     struct Data;
     std::unique_ptr<Data> data_;
 };

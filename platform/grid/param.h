@@ -31,7 +31,8 @@ public:
     // The height of an opened choice list, in pixels.
     void SetDefaultComboBoxHeight(int height) { comboBoxHeight_ = height; }
     int GetDefaultComboBoxHeight() const { return comboBoxHeight_; }
-    // Whether the grid numbers its lines (columns) in their headers by itself; it does from the start.
+    // Whether the grid numbers its lines in their headers by itself; it does from the start. A column's
+    // header shows what it was given, whatever is set here.
     void SetNumberedRowHeaders(BOOL numbered) { numberedRows_ = numbered != 0; }
     void SetNumberedColHeaders(BOOL numbered) { numberedCols_ = numbered != 0; }
     bool IsNumberedRowHeaders() const { return numberedRows_; }

@@ -16,10 +16,12 @@ public:
 
     CGXRange() = default;
     CGXRange(ROWCOL row, ROWCOL col) { SetCells(row, col); }
-    CGXRange(ROWCOL top, ROWCOL left, ROWCOL bottom, ROWCOL right) { SetCells(top, left, bottom, right); }
+    CGXRange(ROWCOL firstRow, ROWCOL firstCol, ROWCOL lastRow, ROWCOL lastCol) {
+        SetCells(firstRow, firstCol, lastRow, lastCol);
+    }
 
     CGXRange& SetCells(ROWCOL row, ROWCOL col) { return SetCells(row, col, row, col); }
-    CGXRange& SetCells(ROWCOL top, ROWCOL left, ROWCOL bottom, ROWCOL right);
+    CGXRange& SetCells(ROWCOL firstRow, ROWCOL firstCol, ROWCOL lastRow, ROWCOL lastCol);
     CGXRange& SetRows(ROWCOL row) { return SetRows(row, row); }
     CGXRange& SetRows(ROWCOL first, ROWCOL last);
     CGXRange& SetCols(ROWCOL col) { return SetCols(col, col); }
@@ -29,6 +31,8 @@ public:
     bool IsCellInRange(ROWCOL row, ROWCOL col) const;
     // Makes a rectangle of whole lines, whole columns or all, within these bounds; a rectangle stays.
     void ExpandRange(ROWCOL firstRow, ROWCOL firstCol, ROWCOL lastRow, ROWCOL lastCol);
+
+    friend bool operator==(const CGXRange&, const CGXRange&) = default;
 
     Kind kind = Kind::None;
     ROWCOL top = 0;

@@ -6,6 +6,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <string_view>
 
 // A colour: 0x00BBGGRR, or one of the screen's own colours with the top byte set.
 using COLORREF = std::uint32_t;
@@ -19,16 +20,18 @@ inline constexpr int alignRight = 2;
 inline constexpr UINT GX_IDS_UA_TOOLTIPTEXT = 51022;
 
 // The ready-made controls of cells.
-inline constexpr UINT GX_IDS_CTRL_EDIT = 0;               // text
-inline constexpr UINT GX_IDS_CTRL_TEXTFIT = 52517;        // a combo box that also takes free text
-inline constexpr UINT GX_IDS_CTRL_CHECKBOX = 52523;       // 0 or 1
-inline constexpr UINT GX_IDS_CTRL_ONEBASED_EX = 52531;    // a choice list whose value counts from 1
-inline constexpr UINT GX_IDS_CTRL_ZEROBASED_EX = 52532;   // a choice list whose value counts from 0
+inline constexpr UINT GX_IDS_CTRL_EDIT = 0;             // text
+inline constexpr UINT GX_IDS_CTRL_TEXTFIT = 52517;      // a combo box that also takes free text
+inline constexpr UINT GX_IDS_CTRL_CHECKBOX = 52523;     // 0 or 1
+inline constexpr UINT GX_IDS_CTRL_ONEBASED_EX = 52531;  // a choice list whose value counts from 1
+inline constexpr UINT GX_IDS_CTRL_ZEROBASED_EX = 52532; // a choice list whose value counts from 0
 
 // A font as a screen picks it.
 struct CGXFont {
     CString face; // empty: the screen's own
     int points = 0;
+
+    friend bool operator==(const CGXFont&, const CGXFont&) = default;
 };
 
 // The attributes of cells. Each may be set or not; styles are laid over one another (standard, column, line,
@@ -42,6 +45,8 @@ public:
     ~CGXStyle();
 
     CGXStyle& SetValue(const char* text);
+    CGXStyle& SetValue(std::string_view text);
+    CGXStyle& SetValue(const CString& text);
     CGXStyle& SetValue(int number);
     // The shortest text that reads back to the same number.
     CGXStyle& SetValue(double number);
@@ -49,7 +54,7 @@ public:
     // The entries of a choice list, each ended by a line feed or a carriage return and a line feed.
     CGXStyle& SetChoiceList(const char* entries);
     CGXStyle& SetReadOnly(BOOL readOnly);
-    // A cell that is not enabled takes no input and cannot be current.
+    // A cell that is not enabled takes no input, and the user cannot make it current.
     CGXStyle& SetEnabled(BOOL enabled);
     CGXStyle& SetHorizontalAlignment(int alignment);
     CGXStyle& SetInterior(COLORREF colour);
@@ -57,9 +62,14 @@ public:
     CGXStyle& SetUserAttribute(UINT attribute, const char* text);
 
     bool HasValue() const;
-    bool IsEmpty() const; // nothing is set
-    // The attributes, or what holds where nothing is set: "", 0, writable, enabled, left, white, the screen's font.
+    bool HasReadOnly() const;
+    bool HasOnlyValue() const; // nothing else is set
+    bool IsEmpty() const;      // nothing is set
+    // The attributes, or what holds where nothing is set: "", 0, writable, enabled, left, white, the screen's
+    // font.
     CString GetValue() const;
+    // The value without a copy; valid until the style changes.
+    std::string_view ValueText() const;
     UINT GetControl() const;
     CString GetChoiceList() const;
     bool GetReadOnly() const;
@@ -73,12 +83,11 @@ public:
     // Lays `upper` over this style: what is set in it wins.
     void ChangeStyle(const CGXStyle& upper);
     void ClearValue();
-    friend bool operator==(const CGXStyle& left, const CGXStyle& right);
+    KOTA_API friend bool operator==(const CGXStyle& left, const CGXStyle& right);
 
 private:
     struct Attributes;
+    const Attributes& Get() const;
     Attributes& Own();
-    std::shared_ptr<const Attributes> attributes_;
+    std::shared_ptr<Attributes> attributes_; // null when nothing was ever set
 };
-
-KOTA_API bool operator==(const CGXStyle& left, const CGXStyle& right);

@@ -2,8 +2,37 @@
 
 #include <algorithm>
 #include <iterator>
+#include <memory>
+#include <utility>
 
 namespace kota::headless {
+
+namespace {
+
+std::unique_ptr<CK31_CBE_ModelDataItem> itemOf(const Location& location) {
+    auto item = std::make_unique<CK31_CBE_ModelDataItem>();
+    item->riverName = location.riverName.c_str();
+    item->chainage = location.chainage;
+    item->chainage2 = location.chainage2;
+    item->dataType = location.dataType;
+    return item;
+}
+
+Location locationOf(const CK31_CBE_ModelDataItem& item) {
+    return {std::string(item.riverName.View()), item.chainage, item.chainage2, item.dataType};
+}
+
+LRESULT handOver(CObject* object) {
+    return reinterpret_cast<LRESULT>(object);
+}
+
+} // namespace
+
+MainWindow::MainWindow() {
+    for (const char* name : {"&File", "&Edit", "&Grid", "&View", "&Window", "&Help"})
+        GetMenu()->AppendPopup(name);
+}
+MainWindow::~MainWindow() = default;
 
 std::vector<Received> MainWindow::received(WPARAM code) const {
     std::vector<Received> chosen;
@@ -12,26 +41,59 @@ std::vector<Received> MainWindow::received(WPARAM code) const {
     return chosen;
 }
 
-LRESULT MainWindow::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
-    const bool toSwitchBoard = message == switchBoardMessage();
-    if (!toSwitchBoard && message != communicationMessage())
-        return CWnd::WindowProc(message, wParam, lParam);
-
+void MainWindow::record(UINT message, WPARAM code, const CKHComm_Package* package) {
     Received record;
     record.message = message;
-    record.code = wParam;
-    if (const auto* package = reinterpret_cast<const CKHComm_Package*>(lParam)) {
+    record.code = code;
+    if (package) {
         record.hasPackage = true;
         record.sender = package->sender;
         record.documentName = package->documentName;
         record.packageKind = package->packageKind;
         record.project = package->project;
         record.items = package->items;
+        if (code == CommunicationCode::LocationChanged && package->items)
+            record.location = locationOf(static_cast<const CK31_CBE_ModelDataItem&>(*package->items));
     }
     received_.push_back(record);
     if (onMessage)
         onMessage(record);
-    return toSwitchBoard && wParam == SwitchBoardCode::JoinProject ? project_ : 0;
+}
+
+LRESULT MainWindow::answer(WPARAM code) {
+    switch (code) {
+    case SwitchBoardCode::JoinProject:
+        return project_.handle;
+    case SwitchBoardCode::OfferRivers: {
+        if (project_.rivers.empty())
+            return 0;
+        auto rivers = std::make_unique<CObList>();
+        for (const std::string& name : project_.rivers)
+            rivers->AddTail(itemOf({.riverName = name}).release());
+        return handOver(rivers.release());
+    }
+    case SwitchBoardCode::OfferLocation: {
+        if (project_.offers.empty())
+            return 0;
+        const Location offer = project_.offers.front();
+        project_.offers.pop_front();
+        return handOver(itemOf(offer).release());
+    }
+    default:
+        return 0;
+    }
+}
+
+LRESULT MainWindow::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+    if (message == showToolbarMessage() || message == hideToolbarMessage()) {
+        record(message, wParam, nullptr);
+        return 0;
+    }
+    const bool toSwitchBoard = message == switchBoardMessage();
+    if (!toSwitchBoard && message != communicationMessage())
+        return CMDIFrameWnd::WindowProc(message, wParam, lParam);
+    record(message, wParam, reinterpret_cast<const CKHComm_Package*>(lParam));
+    return toSwitchBoard ? answer(wParam) : 0;
 }
 
 } // namespace kota::headless

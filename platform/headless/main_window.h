@@ -1,7 +1,8 @@
 #pragma once
 
 #include "exchange/packages/packages.h"
-#include "platform/framework/window.h"
+#include "platform/framework/frame.h"
+#include "platform/headless/project.h"
 
 #include <functional>
 #include <optional>
@@ -18,20 +19,26 @@ struct Received {
     CString documentName;
     std::int32_t packageKind = 0;
     std::intptr_t project = 0;
-    CObject* items = nullptr; // the sender's; may be gone by now
+    CObject* items = nullptr;         // the sender's; may be gone by now
+    std::optional<Location> location; // of LocationChanged: what the item held
 };
 
 // The main window of a shell: answers the editors' requests from a project given to it, and records what
 // they send.
-class MainWindow : public CWnd {
+class MainWindow : public CMDIFrameWnd {
 public:
-    // The handle that code 25 is answered with; 0 means that no project is open.
-    void openProject(std::intptr_t project) { project_ = project; }
+    MainWindow();
+    ~MainWindow() override;
 
-    // Every message of the two registered names so far, in their order.
+    // The handle that code 25 is answered with; 0 means that no project is open.
+    void openProject(std::intptr_t handle) { project_.handle = handle; }
+    Project& project() { return project_; }
+
+    // Every message of the registered names so far, in their order.
     const std::vector<Received>& received() const { return received_; }
     // Those of one code.
     std::vector<Received> received(WPARAM code) const;
+    void forgetReceived() { received_.clear(); }
 
     // Called with each message before it is answered, so that a test can call back into the editor from it.
     std::function<void(const Received&)> onMessage;
@@ -39,7 +46,10 @@ public:
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
 private:
-    std::intptr_t project_ = 0;
+    void record(UINT message, WPARAM code, const CKHComm_Package* package);
+    LRESULT answer(WPARAM code);
+
+    Project project_;
     std::vector<Received> received_;
 };
 

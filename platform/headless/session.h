@@ -4,7 +4,19 @@
 #include "platform/headless/main_window.h"
 #include "platform/headless/screen.h"
 
+#include <string>
+
+class CDocument;
+
 namespace kota::headless {
+
+// The application of a session: notes which help was asked for.
+class Application : public CWinApp {
+public:
+    void WinHelp(UINT context) override { helpContexts.push_back(context); }
+
+    std::vector<UINT> helpContexts;
+};
 
 // A shell without a screen, for tests: an application with a main window, and a screen that answers from a
 // script. One session lives at a time.
@@ -12,22 +24,33 @@ class Session {
 public:
     // `fail` is told what goes against the script; by default the program ends with the text.
     explicit Session(std::function<void(const std::string&)> fail = abortWith);
-    // Answers that nothing asked for are a failure.
+    // Closes what is open without asking. Answers that nothing asked for are a failure.
     ~Session();
     Session(const Session&) = delete;
     Session& operator=(const Session&) = delete;
 
     MainWindow& mainWindow() { return mainWindow_; }
     ScriptedScreen& screen() { return screen_; }
+    Application& application() { return application_; }
+
+    // Makes the templates of a plug-in known; see PlugIn.
+    void load(const std::string& plugIn);
+    // Null when that failed; the user was told why in a box.
+    CDocument* open(const std::string& path);
+    // A new document of the first template.
+    CDocument* create();
+    // Saves under the document's name, or under another one.
+    bool save(CDocument& document);
+    bool saveAs(CDocument& document, const std::string& path);
 
     // Closes the main window, as when the shell is about to end.
-    void closeMainWindow() { mainWindow_.DestroyWindow(); }
+    void closeMainWindow();
 
 private:
     [[noreturn]] static void abortWith(const std::string& text);
 
     std::function<void(const std::string&)> fail_;
-    CWinApp application_;
+    Application application_;
     MainWindow mainWindow_;
     ScriptedScreen screen_;
     Screen* screenBefore_;

@@ -1,0 +1,103 @@
+#include "platform/grid/grid_data.h"
+
+#include <algorithm>
+#include <array>
+#include <cstdint>
+#include <limits>
+
+using kota::grid::CellPlace;
+
+namespace {
+
+enum class Reach { Steps, Pages, Edge };
+
+struct Direction {
+    int rowStep;
+    int colStep;
+    Reach reach;
+};
+
+// By the GX_ constants, from 1.
+constexpr std::array<Direction, 12> directions = {{
+    {-1, 0, Reach::Steps}, // GX_UP
+    {0, -1, Reach::Steps}, // GX_LEFT
+    {1, 0, Reach::Steps},  // GX_DOWN
+    {0, 1, Reach::Steps},  // GX_RIGHT
+    {-1, 0, Reach::Pages}, // GX_PAGEUP
+    {1, 0, Reach::Pages},  // GX_PAGEDOWN
+    {-1, 0, Reach::Edge},  // GX_TOP
+    {1, 0, Reach::Edge},   // GX_BOTTOM
+    {0, -1, Reach::Edge},  // GX_MOSTLEFT
+    {0, 1, Reach::Edge},   // GX_MOSTRIGHT
+    {1, 1, Reach::Edge},   // GX_BOTTOMRIGHT
+    {-1, -1, Reach::Edge}, // GX_TOPLEFT
+}};
+
+// A number of lines or columns that reaches every edge.
+constexpr std::int64_t allTheWay = std::numeric_limits<ROWCOL>::max();
+
+// From the edge of what covers the current cell, `distance` further, within the bounds.
+ROWCOL moved(ROWCOL low, ROWCOL high, std::int64_t distance, ROWCOL first, ROWCOL last) {
+    const std::int64_t target = (distance < 0 ? std::int64_t{low} : std::int64_t{high}) + distance;
+    return static_cast<ROWCOL>(std::clamp<std::int64_t>(target, first, last));
+}
+
+} // namespace
+
+BOOL CGXGridCore::GetCurrentCell(ROWCOL* row, ROWCOL* col) const {
+    if (row)
+        *row = data_->current.row;
+    if (col)
+        *col = data_->current.col;
+    return !data_->current.isNone();
+}
+
+BOOL CGXGridCore::SetCurrentCell(ROWCOL row, ROWCOL col, UINT flags) {
+    if (!data_->commitEdit())
+        return FALSE;
+    for (const CellPlace place : {data_->current, CellPlace{row, col}})
+        if (data_->cells.exists(place.row, place.col))
+            data_->noteCells(place.row, place.col, place.row, place.col);
+    data_->current = {row, col};
+    data_->note(&kota::GridChanges::current);
+    if (flags & (GX_SCROLLINVIEW | GX_DISPLAYEDITWND))
+        data_->note(&kota::GridChanges::scroll);
+    if (!(flags & GX_KEEPFOCUS) && !data_->current.isNone() && GetSafeHwnd())
+        SetFocus();
+    return TRUE;
+}
+
+BOOL CGXGridCore::MoveCurrentCell(int direction, int count, BOOL /*update*/) {
+    const CellPlace first{GetHeaderRows() + 1, GetHeaderCols() + 1};
+    const CellPlace last{GetRowCount(), GetColCount()};
+    if (direction < GX_UP || direction > GX_TOPLEFT || count < 1 || first.row > last.row ||
+        first.col > last.col)
+        return FALSE;
+    const auto [rowStep, colStep, reach] = directions[static_cast<std::size_t>(direction - 1)];
+    const std::int64_t page = std::int64_t{data_->pageRows} * count;
+    const std::int64_t distance = reach == Reach::Steps ? count : reach == Reach::Pages ? page : allTheWay;
+    const CellPlace from = data_->current.isNone() ? first : data_->current;
+    const CGXRange here = GetCoveredCellsRowCol(from.row, from.col);
+    CellPlace to{moved(here.top, here.bottom, rowStep * distance, first.row, last.row),
+                 moved(here.left, here.right, colStep * distance, first.col, last.col)};
+    // A step goes on past cells that are not enabled, a jump comes back to the first that is.
+    const int back = reach == Reach::Steps ? 1 : -1;
+    while (to != data_->current && !data_->isEnabled(to)) {
+        const CellPlace next{moved(to.row, to.row, back * rowStep, first.row, last.row),
+                             moved(to.col, to.col, back * colStep, first.col, last.col)};
+        if (next == to)
+            return FALSE;
+        to = next;
+    }
+    const CGXRange target = GetCoveredCellsRowCol(to.row, to.col);
+    if (data_->current == CellPlace{target.top, target.left})
+        return FALSE;
+    return SetCurrentCell(target.top, target.left, GX_SCROLLINVIEW | GX_DISPLAYEDITWND);
+}
+
+bool CGXGridCore::LetFocusGo() {
+    if (!IsEditPending())
+        return true;
+    const CellPlace current = data_->current;
+    return SetCurrentCell(current.row, current.col, GX_KEEPFOCUS) && !IsEditPending();
+}

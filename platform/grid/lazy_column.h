@@ -1,0 +1,58 @@
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <utility>
+#include <vector>
+
+namespace kota::grid {
+
+// A value for each line, of which only those up to the last one written take memory; the others are T{}.
+template <class T>
+class LazyColumn {
+public:
+    LazyColumn() = default;
+    LazyColumn(LazyColumn&&) noexcept = default;
+    LazyColumn& operator=(LazyColumn&&) noexcept = default;
+
+    const T& operator[](std::size_t line) const { return line < lines_.size() ? lines_[line] : unwritten; }
+
+    // The value of a line, to be written. `lines` is how many there are in all.
+    T& write(std::size_t line, std::size_t lines) {
+        if (line >= lines_.size())
+            grow(line + 1, lines);
+        return lines_[line];
+    }
+
+    void insert(std::size_t line, std::size_t count) {
+        if (line >= lines_.size())
+            return;
+        lines_.resize(lines_.size() + count);
+        const auto gap = lines_.begin() + static_cast<std::ptrdiff_t>(line);
+        std::move_backward(gap, lines_.end() - static_cast<std::ptrdiff_t>(count), lines_.end());
+        std::generate_n(gap, count, [] { return T{}; });
+    }
+
+    void erase(std::size_t first, std::size_t last) {
+        if (first >= lines_.size())
+            return;
+        const std::size_t end = std::min(last + 1, lines_.size());
+        lines_.erase(lines_.begin() + static_cast<std::ptrdiff_t>(first),
+                     lines_.begin() + static_cast<std::ptrdiff_t>(end));
+    }
+
+private:
+    // Room for all lines there are, or for a quarter more than before where lines are appended one by one.
+    // Room that is not used yet costs no memory but addresses.
+    void grow(std::size_t size, std::size_t lines) {
+        if (size > lines_.capacity())
+            lines_.reserve(std::max(lines, lines_.capacity() + lines_.capacity() / 4));
+        lines_.resize(size);
+    }
+
+    static inline const T unwritten{};
+
+    std::vector<T> lines_;
+};
+
+} // namespace kota::grid
