@@ -2,6 +2,7 @@
 
 #include <chrono>
 #include <cstdlib>
+#include <fstream>
 #include <stdexcept>
 #include <sys/resource.h>
 #include <sys/wait.h>
@@ -17,9 +18,19 @@ double measure(const std::function<void()>& work) {
     return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
 }
 
+double residentMegabytes() {
+    long pages = 0;
+    long resident = 0;
+    std::ifstream("/proc/self/statm") >> pages >> resident;
+    return static_cast<double>(resident) * static_cast<double>(sysconf(_SC_PAGESIZE)) / 1e6;
+}
+
 [[noreturn]] void runAsChild(const std::function<std::function<void()>()>& prepare, int result) {
     Measured measured;
-    measured.seconds = measure(prepare());
+    const std::function<void()> work = prepare();
+    const double before = residentMegabytes();
+    measured.seconds = measure(work);
+    measured.grownMegabytes = residentMegabytes() - before;
     rusage usage{};
     getrusage(RUSAGE_SELF, &usage);
     measured.peakMegabytes = static_cast<double>(usage.ru_maxrss) / 1024;
