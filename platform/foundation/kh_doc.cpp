@@ -61,6 +61,7 @@ BOOL CKhDoc::OnOpenDocument(const char* path) {
 }
 
 BOOL CKhDoc::DoSave(const char* path) {
+    TakePendingInput(); // a text that is refused stays in its cell, and out of the file
     CString name = path;
     if (name.IsEmpty()) {
         kota::Screen* screen = kota::attachedScreen();

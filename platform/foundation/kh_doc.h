@@ -13,10 +13,11 @@ public:
     // cannot be opened, after telling the user why: then the document is as it was.
     BOOL OnOpenDocument(const char* path) override;
 
-    // Saves through OnSaveDocument, and so that nothing is lost: the version before is kept as NAME~ beside
-    // the file, whose folder must be writable for that. When the file library could not write, the old file
-    // is put back, the user is told why, the document is marked as modified, and the result is 0. After a
-    // save the document's path and title are those of the file that was written.
+    // Takes over what is being typed, as far as it is valid, and saves through OnSaveDocument, and so that
+    // nothing is lost: the version before is kept as NAME~ beside the file, whose folder must be writable for
+    // that. When the file library could not write, the old file is put back, the user is told why, the
+    // document is marked as modified, and the result is 0. After a save the document's path and title are
+    // those of the file that was written.
     BOOL DoSave(const char* path) override;
 
 protected:

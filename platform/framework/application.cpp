@@ -46,6 +46,7 @@ CWinApp::~CWinApp() {
 }
 
 void CWinApp::AddDocTemplate(std::unique_ptr<CDocTemplate> docTemplate) {
+    kota::keep(docTemplate.get());
     std::erase(adopted_, docTemplate.get());
     known_.push_back(docTemplate.release());
 }
@@ -55,6 +56,7 @@ bool CWinApp::Knows(const CDocTemplate* docTemplate) const {
 }
 
 void CWinApp::Adopt(CDocTemplate* docTemplate) {
+    kota::keep(docTemplate);
     if (!Knows(docTemplate) && std::ranges::find(adopted_, docTemplate) == adopted_.end())
         adopted_.push_back(docTemplate);
 }

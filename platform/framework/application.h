@@ -33,7 +33,7 @@ public:
     void AddDocTemplate(std::unique_ptr<CDocTemplate> docTemplate);
     const std::vector<CDocTemplate*>& Templates() const { return known_; }
     // Opens a file by the template whose extension it bears, upper or lower case; null when there is none or
-    // it failed. A document that is open already comes to the front.
+    // it failed. A document of a known template that is open already comes to the front.
     virtual CDocument* OpenDocumentFile(const char* path);
     // Shows the page of the help that a context number names.
     virtual void WinHelp(UINT context);

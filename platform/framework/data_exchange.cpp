@@ -13,10 +13,9 @@ std::vector<CWnd*> radioGroup(CWnd* first) {
         return group;
     for (const HWND handle : around->State()->children) {
         CWnd* const button = CWnd::FromHandle(handle);
-        const bool isRadio = button->State()->setup.kind == kota::WindowKind::RadioButton;
-        if (button == first)
-            group.push_back(button);
-        else if (!group.empty() && isRadio && !button->State()->startsGroup)
+        const bool follows = !group.empty() && !button->State()->startsGroup &&
+                             button->State()->setup.kind == kota::WindowKind::RadioButton;
+        if (button == first || follows)
             group.push_back(button);
         else if (!group.empty())
             break;
@@ -42,6 +41,8 @@ void DDX_Text(CDataExchange* exchange, UINT id, CString& value) {
 }
 
 void DDX_Text(CDataExchange* exchange, UINT id, int& value) {
+    if (!exchange->dialog->GetDlgItem(id))
+        return;
     CString text;
     if (!exchange->saveAndValidate)
         text.Format("%d", value);
@@ -70,7 +71,7 @@ void DDX_Check(CDataExchange* exchange, UINT id, int& value) {
 
 void DDX_Radio(CDataExchange* exchange, UINT id, int& value) {
     const std::vector<CWnd*> group = radioGroup(exchange->dialog->GetDlgItem(id));
-    if (exchange->saveAndValidate)
+    if (exchange->saveAndValidate && !group.empty())
         value = -1;
     for (int place = 0; place < std::ssize(group); ++place) {
         if (!exchange->saveAndValidate)

@@ -79,6 +79,9 @@ int CDialog::DoModal() {
         return -1;
     if (CWnd* const first = FirstFocusControl())
         first->SetFocus();
+    // While another window keeps the focus, the user could do nothing in the dialog.
+    if (focusBefore && FirstFocusControl() && ::GetFocus() == focusBefore)
+        EndDialog(IDCANCEL);
     if (!ended_) {
         kota::tellScreen();
         screen->showDialog(*this);
@@ -87,6 +90,11 @@ int CDialog::DoModal() {
     DestroyWindow();
     ::SetFocus(IsWindow(focusBefore) ? focusBefore : nullptr);
     return result_;
+}
+
+void CDialog::PostNcDestroy() {
+    ended_ = true;
+    CWnd::PostNcDestroy();
 }
 
 void CDialog::EndDialog(int result) {
@@ -144,6 +152,13 @@ BOOL CDialog::PreTranslateMessage(MSG* message) {
     if (!modal_ || (message->wParam != VK_RETURN && message->wParam != VK_ESCAPE))
         return FALSE;
     message->wParam == VK_RETURN ? OnOK() : OnCancel();
+    return TRUE;
+}
+
+LRESULT CDialog::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+    if (message != WM_CLOSE || !modal_)
+        return CWnd::WindowProc(message, wParam, lParam);
+    OnCancel();
     return TRUE;
 }
 

@@ -24,7 +24,7 @@ public:
     // the module has no such template or the dialog has a window.
     BOOL Create(UINT templateId, CWnd* parent);
     // Shows the dialog and waits until it is ended; gives the result of EndDialog. -1 when it cannot be built
-    // or no screen is attached.
+    // or no screen is attached; IDCANCEL, and nothing is shown, when the window with the focus keeps it.
     int DoModal();
     void EndDialog(int result);
     bool IsEnded() const { return ended_; }
@@ -43,10 +43,14 @@ public:
     BOOL OnCmdMsg(UINT id, int notification) override;
     // The Tab key moves among the controls; Enter and Escape end a modal dialog.
     BOOL PreTranslateMessage(MSG* message) override;
+    // The close button of a modal dialog cancels it.
+    LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
     // The first control that takes the focus; null when there is none.
     CWnd* FirstFocusControl() const;
 
 protected:
+    // A dialog whose window is gone is ended.
+    void PostNcDestroy() override;
     BOOL CreateOf(kota::WindowKind kind, UINT templateId, CWnd* parent);
 
 private:

@@ -62,6 +62,13 @@ void CDocument::OnCloseDocument() {
     delete this;
 }
 
+BOOL CDocument::TakePendingInput() {
+    CWnd* const focus = CWnd::GetFocus();
+    const bool isHere =
+        focus && std::ranges::any_of(views_, [&](const CView* view) { return view->IsChild(focus); });
+    return !isHere || focus->LetFocusGo();
+}
+
 BOOL CDocument::CanCloseFrame(CFrameWnd* frame) {
     const bool another = std::ranges::any_of(
         views_, [&](const CView* view) { return view->GetParentFrame() && view->GetParentFrame() != frame; });

@@ -55,6 +55,9 @@ public:
     // Whether a frame of the document may be closed: not when it is the last one and the user, asked about
     // changes, wants to stay.
     virtual BOOL CanCloseFrame(CFrameWnd* frame);
+    // Has the control with the focus, if it is in a view of the document, take over what the user typed. 0
+    // when it refuses.
+    BOOL TakePendingInput();
     // The template that made the document; null when somebody else did, who owns it.
     CDocTemplate* GetDocTemplate() const { return docTemplate_; }
     // Saves under the document's own name, or asks for another one: the commands of the File menu.

@@ -1,11 +1,15 @@
+#include "platform/framework/frame.h"
 #include "platform/framework/guard.h"
 #include "platform/framework/turn.h"
 #include "platform/framework/window.h"
 #include "platform/framework/window_registry.h"
 
+#include <utility>
+
 namespace {
 
 HWND theFocus = nullptr;
+HWND nextFocus = nullptr; // while the focus is on its way there
 
 bool canTakeFocus(HWND handle) {
     const CWnd* const window = CWnd::FromHandle(handle);
@@ -37,12 +41,18 @@ HWND SetFocus(HWND handle) {
     if (handle == previous || (handle && !canTakeFocus(handle)) || !holderLetsGo())
         return previous;
     const HWND leaving = theFocus;
-    if (handle == leaving || (handle && !IsWindow(handle)))
+    if (handle == leaving || (handle && !canTakeFocus(handle)))
         return previous;
+    for (CWnd* window = CWnd::FromHandle(leaving); window; window = window->GetParent())
+        window->FocusLeft(leaving);
     theFocus = nullptr;
+    if (leaving)
+        kota::noteChange(leaving, kota::Change::Focus);
+    const HWND nextBefore = std::exchange(nextFocus, handle);
     SendMessage(leaving, WM_KILLFOCUS, reinterpret_cast<WPARAM>(handle), 0);
-    // The old holder may have closed the new one, or given the focus elsewhere, on its way out.
-    if (theFocus || !IsWindow(handle))
+    nextFocus = nextBefore;
+    // The old holder may have closed or disabled the new one, or given the focus elsewhere, on its way out.
+    if (theFocus || !canTakeFocus(handle))
         return previous;
     theFocus = handle;
     kota::noteChange(handle, kota::Change::Focus);
@@ -52,6 +62,12 @@ HWND SetFocus(HWND handle) {
 
 HWND GetFocus() {
     return theFocus;
+}
+
+bool CWnd::MayTakeFocus() const {
+    const CWnd* const holder = FromHandle(theFocus ? theFocus : nextFocus);
+    CFrameWnd* const frame = holder ? holder->GetParentFrame() : nullptr;
+    return !frame || frame == GetParentFrame() || frame->IsChild(this);
 }
 
 CWnd* CWnd::SetFocus() {

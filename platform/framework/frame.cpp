@@ -34,7 +34,7 @@ BOOL CFrameWnd::OnCreateClient(CREATESTRUCT* /*create*/, const CCreateContext& c
     }
     auto* const view = static_cast<CView*>(object);
     if (!view->CreateView(this, context)) {
-        delete view;
+        kota::deleteLater(view); // it may have a window and a document already
         return FALSE;
     }
     activeView_ = view->GetSafeHwnd();
@@ -63,7 +63,7 @@ void CFrameWnd::ActivateFrame() {
 
 void CFrameWnd::OnClose() {
     CDocument* const document = GetActiveDocument();
-    if (document && !document->CanCloseFrame(this))
+    if (document && (!document->TakePendingInput() || !document->CanCloseFrame(this)))
         return;
     DestroyWindow();
 }

@@ -71,6 +71,8 @@ public:
     // The frames, in the order in which they were made.
     std::vector<CMDIChildWnd*> Children() const;
 
+    // Closes the frames first, and stays if one of them does.
+    void OnClose() override;
     CMenu* GetMenu() override { return &menu_; }
     // A command goes to the frame in front first. "New Window" is the main window's own.
     BOOL OnCmdMsg(UINT id, int notification) override;

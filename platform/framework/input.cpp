@@ -7,6 +7,7 @@
 #include "platform/framework/turn.h"
 
 #include <algorithm>
+#include <string_view>
 #include <utility>
 
 namespace {
@@ -40,6 +41,22 @@ bool takesInput(const CWnd& window) {
     return window.IsWindowEnabled() && window.IsWindowVisible();
 }
 
+// Moves the focus to a window. Whoever loses it may disable or close the window on the way.
+bool moveFocus(CWnd& window) {
+    if (!takesInput(window))
+        return false;
+    window.SetFocus();
+    return takesInput(window) && ::GetFocus() == window.GetSafeHwnd();
+}
+
+// Whether the menu has the command greyed, by itself or with the menu around it.
+bool isGreyed(const CMenu& menu, UINT id, bool enabledAround = true) {
+    return std::ranges::any_of(menu.Entries(), [&](const CMenu::Entry& entry) {
+        const bool enabled = enabledAround && entry.enabled;
+        return entry.submenu ? isGreyed(*entry.submenu, id, enabled) : entry.id == id && !enabled;
+    });
+}
+
 // One input: a turn, guarded.
 template <class Action>
 bool perform(Action action) {
@@ -66,6 +83,17 @@ void tellParent(const CWnd& control, int notification) {
     }
 }
 
+// The first characters of a text, at most so many.
+std::string_view firstCharacters(std::string_view text, int count) {
+    const auto startsCharacter = [](char byte) {
+        return (static_cast<unsigned char>(byte) & 0xC0U) != 0x80U;
+    };
+    for (std::size_t i = 0; i < text.size(); ++i)
+        if (startsCharacter(text[i]) && count-- == 0)
+            return text.substr(0, i);
+    return text;
+}
+
 void comeOn(CWnd& radio) {
     const auto& siblings = radio.GetParent()->State()->children;
     const auto isRadio = [](HWND handle) {
@@ -86,11 +114,11 @@ void comeOn(CWnd& radio) {
 } // namespace
 
 bool key(WPARAM key, Modifiers modifiers) {
+    const HeldScope scope(modifiers); // what the turn posts is delivered while they are held
     return perform([&] {
-        const HeldScope scope(modifiers);
         MSG message{.hwnd = ::GetFocus(), .message = WM_KEYDOWN, .wParam = key, .lParam = 0};
-        if (!IsWindow(message.hwnd) || translated(message))
-            return IsWindow(message.hwnd);
+        if (translated(message))
+            return true;
         if (key == VK_F1)
             return ::SendMessage(message.hwnd, WM_HELP, 0, 0) != 0;
         return ::SendMessage(message.hwnd, WM_KEYDOWN, key, 0) != 0;
@@ -98,29 +126,22 @@ bool key(WPARAM key, Modifiers modifiers) {
 }
 
 bool focus(CWnd& window) {
-    return perform([&] {
-        if (!takesInput(window))
-            return false;
-        window.SetFocus();
-        return ::GetFocus() == window.GetSafeHwnd();
-    });
+    return perform([&] { return moveFocus(window); });
 }
 
 bool typeText(CWnd& edit, const char* text) {
     return perform([&] {
-        if (!takesInput(edit) || edit.State()->setup.kind != WindowKind::Edit || !focus(edit))
+        if (!takesInput(edit) || edit.State()->setup.kind != WindowKind::Edit || !moveFocus(edit))
             return false;
-        const std::string_view typed(text);
         const int limit = edit.State()->textLimit;
-        const std::size_t length = limit > 0 ? static_cast<std::size_t>(limit) : typed.size();
-        edit.SetWindowText(CString(typed.substr(0, length)));
+        edit.SetWindowText(limit > 0 ? CString(firstCharacters(text, limit)) : CString(text));
         return true;
     });
 }
 
 bool click(CWnd& button) {
     return perform([&] {
-        if (!takesInput(button) || !focus(button))
+        if (!moveFocus(button))
             return false;
         switch (button.State()->setup.kind) {
         case WindowKind::CheckBox:
@@ -143,7 +164,7 @@ bool choose(CWnd& comboBox, int entry) {
     return perform([&] {
         const bool exists =
             takesInput(comboBox) && entry >= 0 && entry < std::ssize(comboBox.State()->choices);
-        if (!exists || !focus(comboBox))
+        if (!exists || !moveFocus(comboBox))
             return false;
         comboBox.SendMessage(CB_SETCURSEL, static_cast<WPARAM>(entry));
         tellParent(comboBox, CBN_SELCHANGE);
@@ -170,6 +191,9 @@ bool selectTab(CPropertySheet& sheet, int index) {
 bool command(UINT id) {
     return perform([&] {
         CWnd* const mainWindow = AfxGetMainWnd();
+        const CMenu* const menu = mainWindow ? mainWindow->GetMenu() : nullptr;
+        if (menu && isGreyed(*menu, id))
+            return false;
         return mainWindow && mainWindow->SendMessage(WM_COMMAND, commandParam(id, 0)) != 0;
     });
 }
@@ -177,6 +201,8 @@ bool command(UINT id) {
 bool close(CWnd& window) {
     return perform([&] {
         const HWND handle = window.GetSafeHwnd();
+        if (!takesInput(window))
+            return false;
         ::SendMessage(handle, WM_CLOSE, 0, 0);
         return !IsWindow(handle);
     });

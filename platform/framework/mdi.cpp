@@ -48,10 +48,13 @@ void CMDIFrameWnd::MDIActivate(CMDIChildWnd* child) {
     CMDIChildWnd* const before = MDIGetActive();
     if (child == before)
         return;
-    if (CView* const view = before ? before->GetActiveView() : nullptr)
-        view->OnActivateView(FALSE, view, view);
-    activeChild_ = child ? child->GetSafeHwnd() : nullptr;
-    CView* const view = child ? child->GetActiveView() : nullptr;
+    const HWND entered = child ? child->GetSafeHwnd() : nullptr;
+    activeChild_ = entered;
+    if (CView* const left = before ? before->GetActiveView() : nullptr)
+        left->OnActivateView(FALSE, left, left);
+    // Whoever was told may have brought another frame to the front, or closed this one.
+    const bool isEntered = child && activeChild_ == entered && IsWindow(entered);
+    CView* const view = isEntered ? child->GetActiveView() : nullptr;
     if (!view)
         return;
     child->BringWindowToTop();
@@ -65,6 +68,17 @@ std::vector<CMDIChildWnd*> CMDIFrameWnd::Children() const {
         if (CWnd* const child = FromHandle(handle); child->IsKindOf(RUNTIME_CLASS(CMDIChildWnd)))
             frames.push_back(static_cast<CMDIChildWnd*>(child));
     return frames;
+}
+
+void CMDIFrameWnd::OnClose() {
+    for (CMDIChildWnd* child : Children()) {
+        const HWND handle = child->GetSafeHwnd();
+        if (IsWindow(handle))
+            child->OnClose();
+        if (IsWindow(handle))
+            return;
+    }
+    CFrameWnd::OnClose();
 }
 
 BOOL CMDIFrameWnd::OnCmdMsg(UINT id, int notification) {

@@ -2,6 +2,7 @@
 
 #include "platform/framework/application.h"
 #include "platform/framework/screen.h"
+#include "platform/framework/turn.h"
 
 #include <cstdio>
 
@@ -14,6 +15,7 @@ int MessageBox(HWND owner, const char* text, const char* caption, UINT type) {
     kota::MessageBoxRequest request{.owner = owner, .text = text, .caption = {}, .type = type};
     if (caption)
         request.caption = caption;
+    kota::tellScreen(); // a screen draws on while the box is open
     return screen->showMessageBox(request);
 }
 

@@ -51,6 +51,7 @@ BOOL CPropertySheet::Create(CWnd* parent, unsigned style, unsigned extendedStyle
     kota::createTabs(GetSafeHwnd(), AFX_IDC_TAB_CONTROL, std::move(captions));
     GetTabControl()->SetWindowRect(nominalRect);
     OnInitDialog();
+    const kota::FlagScope change(changing_);
     if (!pages_.empty())
         ShowPage(0);
     return TRUE;
@@ -98,7 +99,7 @@ bool CPropertySheet::LeaveActivePage() {
     const HWND holder = page->IsChild(focus) ? focus->GetSafeHwnd() : nullptr;
     if (holder) {
         GetTabControl()->SetFocus();
-        if (::GetFocus() == holder)
+        if (!GetSafeHwnd() || ::GetFocus() == holder)
             return false;
     }
     if (page->OnKillActive())

@@ -95,6 +95,7 @@ CDocument* CMultiDocTemplate::OpenDocumentFile(const char* path, BOOL makeVisibl
         document->OnCloseDocument();
         return nullptr;
     }
+    const HWND window = frame->GetSafeHwnd();
     InitialUpdateFrame(frame, document, makeVisible);
-    return document;
+    return IsWindow(window) ? document : nullptr; // the shell may have closed it meanwhile
 }

@@ -52,6 +52,9 @@ Turn::~Turn() {
         deleteDoomed();
     tellScreen();
     --pending().depth;
+    // What the screen itself changed while it was told, and messages that go on and on, are another turn's.
+    if (pending().depth == 0 && attachedScreen() && !(pending().changes.empty() && pending().posted.empty()))
+        attachedScreen()->changesPending();
 }
 
 void deleteLater(CObject* object) {
@@ -60,6 +63,10 @@ void deleteLater(CObject* object) {
         doomed.push_back(object);
     if (pending().depth == 0 && attachedScreen())
         attachedScreen()->changesPending();
+}
+
+void keep(const CObject* object) {
+    std::erase(pending().doomed, object);
 }
 
 void postMessage(const MSG& message) {

@@ -21,6 +21,8 @@ public:
 
 // Deletes an object when nothing of it can be running any more: at the end of the outermost turn.
 KOTA_API void deleteLater(CObject* object);
+// Takes that back: somebody uses the object again before the turn ends.
+KOTA_API void keep(const CObject* object);
 
 // Puts a message off to the end of the turn.
 KOTA_API void postMessage(const MSG& message);

@@ -3,6 +3,7 @@
 #include "platform/framework/dialog.h"
 #include "platform/framework/document.h"
 #include "platform/framework/frame.h"
+#include "platform/framework/tab_order.h"
 #include "platform/framework/turn.h"
 
 IMPLEMENT_DYNAMIC(CView, CWnd, kota::platformModule)
@@ -74,15 +75,9 @@ BOOL CFormView::CreateView(CFrameWnd* frame, const CCreateContext& context) {
     return TRUE;
 }
 
-void CFormView::RememberFocus(HWND control) {
-    if (IsChild(FromHandle(control)))
-        lastFocus_ = control;
-}
-
-void CFormView::OnActivateView(BOOL activate, CView* activateView, CView* deactiveView) {
-    if (!activate)
-        RememberFocus(::GetFocus());
-    CView::OnActivateView(activate, activateView, deactiveView);
+void CFormView::FocusLeft(HWND window) {
+    if (window != GetSafeHwnd())
+        lastFocus_ = window;
 }
 
 void CFormView::ResizeParentToFit(BOOL /*shrinkOnly*/) {
@@ -92,9 +87,11 @@ void CFormView::ResizeParentToFit(BOOL /*shrinkOnly*/) {
 
 LRESULT CFormView::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == WM_SETFOCUS) {
-        RememberFocus(reinterpret_cast<HWND>(wParam));
-        if (IsWindow(lastFocus_))
-            ::SetFocus(lastFocus_);
+        CWnd* const last = FromHandle(lastFocus_);
+        CWnd* const holder =
+            last && IsChild(last) && last->IsWindowVisible() ? last : kota::firstInTabOrder(*this);
+        if (holder)
+            holder->SetFocus();
         return 0;
     }
     return CView::WindowProc(message, wParam, lParam);

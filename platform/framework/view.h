@@ -64,15 +64,13 @@ public:
     ~CFormView() override;
 
     BOOL CreateView(CFrameWnd* frame, const CCreateContext& context) override;
-    void OnActivateView(BOOL activate, CView* activateView, CView* deactiveView) override;
+    void FocusLeft(HWND window) override;
     // The frame takes the size that the form needs; with `shrinkOnly` it does not grow.
     void ResizeParentToFit(BOOL shrinkOnly = TRUE);
     // The focus goes on to the control that had it last.
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
 private:
-    void RememberFocus(HWND control);
-
     UINT templateId_;
     HWND lastFocus_ = nullptr;
 };

@@ -27,7 +27,7 @@ BOOL CWnd::Create(const kota::WindowSetup& setup) {
 
 BOOL CWnd::SubclassDlgItem(UINT id, CWnd* dialog) {
     const CWnd* const control = dialog && !handle_ ? dialog->GetDlgItem(id) : nullptr;
-    if (!control || control->GetRuntimeClass() != RUNTIME_CLASS(CWnd))
+    if (!control || !kota::hasPlainObject(control->handle_))
         return FALSE;
     handle_ = control->handle_;
     kota::releaseWindow(handle_, this);
@@ -41,16 +41,18 @@ HWND CWnd::Detach() {
 }
 
 BOOL CWnd::DestroyWindow() {
-    const kota::WindowState* const state = State();
-    if (!state)
+    if (!handle_)
         return FALSE;
-    while (!state->children.empty())
-        if (CWnd* child = FromHandle(state->children.back()))
-            child->DestroyWindow();
+    // What closes with a window inside may close this one.
+    for (const kota::WindowState* state = State(); state && !state->children.empty(); state = State())
+        FromHandle(state->children.back())->DestroyWindow();
+    if (!handle_)
+        return TRUE;
     kota::forgetFocus(handle_);
     const HWND handle = std::exchange(handle_, nullptr);
     kota::unregisterWindow(handle);
-    PostNcDestroy();
+    PostNcDestroy(); // NOLINT(clang-analyzer-optin.cplusplus.VirtualCall): a destroyed object has only this
+                     // one
     return TRUE;
 }
 
@@ -212,6 +214,7 @@ void CWnd::BringWindowToTop() {
 
 BOOL CWnd::SetForegroundWindow() {
     BringWindowToTop();
+    SetFocus();
     return handle_ != nullptr;
 }
 
@@ -241,6 +244,7 @@ BOOL CWnd::PreTranslateMessage(MSG* /*message*/) {
 bool CWnd::LetFocusGo() {
     return true;
 }
+void CWnd::FocusLeft(HWND /*window*/) {}
 
 void CWnd::NotifyParent(int notification) {
     const kota::WindowState* const state = State();
@@ -270,6 +274,7 @@ LRESULT CWnd::DefWindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
         return ::SendMessage(state->setup.parent, message, wParam, lParam);
     case EM_LIMITTEXT:
         state->textLimit = static_cast<int>(wParam);
+        kota::noteChange(handle_, kota::Change::State);
         return 0;
     case CB_GETCURSEL:
         return state->chosen;

@@ -72,8 +72,9 @@ public:
     void ModifyStyleEx(unsigned remove, unsigned add);
     CRect GetWindowRect() const;
     void SetWindowRect(const CRect& rect);
-    // Asks the screen to bring the window in front of its siblings, and to the user.
+    // Asks the screen to bring the window in front of its siblings.
     void BringWindowToTop();
+    // The same, and gives it the focus.
     BOOL SetForegroundWindow();
 
     virtual CMenu* GetMenu();
@@ -87,6 +88,9 @@ public:
     // Takes the focus, unless the window that has it keeps it, and gives the window that had it, or null.
     CWnd* SetFocus();
     static CWnd* GetFocus();
+    // Whether the window may take the focus without being asked to by the user: not from another document's
+    // frame.
+    bool MayTakeFocus() const;
     // Shows a box owned by this window.
     int MessageBox(const char* text, const char* caption = nullptr, UINT type = 0);
 
@@ -94,6 +98,8 @@ public:
     virtual BOOL PreTranslateMessage(MSG* message);
     // Asked before the focus leaves the window; false keeps it here. What is pending is committed in this.
     virtual bool LetFocusGo();
+    // The focus leaves this window or one inside it.
+    virtual void FocusLeft(HWND window);
     // What the window does with a message: a command goes to OnCmdMsg, the rest to DefWindowProc.
     virtual LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam);
 

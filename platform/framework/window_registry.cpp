@@ -65,6 +65,11 @@ CWnd* adoptWindow(HWND handle, std::unique_ptr<CWnd> object) {
     return entry.state.object;
 }
 
+bool hasPlainObject(HWND handle) {
+    const auto found = registry().alive.find(handle);
+    return found != registry().alive.end() && found->second.owned != nullptr;
+}
+
 void releaseWindow(HWND handle, CWnd* object) {
     Entry& entry = registry().alive.at(handle);
     entry.state.object = object;

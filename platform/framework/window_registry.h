@@ -15,6 +15,8 @@ void unregisterWindow(HWND handle);
 WindowState* windowState(HWND handle);
 // Makes a plain object the window's own, until another takes the window over.
 CWnd* adoptWindow(HWND handle, std::unique_ptr<CWnd> object);
+// Whether the object of a window is the plain one of its own.
+bool hasPlainObject(HWND handle);
 // Hands the window over to `object`; the plain one that it had lets go of it.
 void releaseWindow(HWND handle, CWnd* object);
 // The window that a control reports to: the nearest around it that is no mere group or row.

@@ -78,7 +78,7 @@ enum class Change : unsigned {
     Made = 1,       // the window is new
     Gone = 2,       // the window is no more
     Text = 4,       // text or tool tip
-    State = 8,      // enabled, visible, checked
+    State = 8,      // enabled, visible, checked, how much may be typed
     Choices = 16,   // choices or which is chosen
     Focus = 32,     // it has or had the focus
     Menu = 64,      // the window's menu

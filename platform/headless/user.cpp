@@ -16,6 +16,8 @@ template <class Window>
 Window* firstOf(const CWnd& around) {
     for (const HWND handle : around.State()->children) {
         CWnd* const child = CWnd::FromHandle(handle);
+        if (!child)
+            continue;
         if (auto* const wanted = dynamic_cast<Window*>(child))
             return wanted;
         if (auto* const deeper = firstOf<Window>(*child))
@@ -97,11 +99,15 @@ bool User::enter(const std::string& text) {
 }
 
 bool User::choose(const std::string& entry) {
+    grid::dropDown(grid(), true); // the list may be filled by that alone
     const auto [row, col] = cursor();
     CGXStyle style;
     grid().ComposeStyleRowCol(row, col, &style);
-    return grid::chooseEntry(grid(),
-                             CGXControl::FindStringInChoiceList(entry.c_str(), style.GetChoiceList(), TRUE));
+    const bool chosen = grid::chooseEntry(
+        grid(), CGXControl::FindStringInChoiceList(entry.c_str(), style.GetChoiceList(), TRUE));
+    if (!chosen)
+        grid::dropDown(grid(), false);
+    return chosen;
 }
 
 bool User::clickBox(ROWCOL row, ROWCOL col) {
