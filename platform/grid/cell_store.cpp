@@ -1,6 +1,6 @@
 #include "platform/grid/cell_store.h"
 
-#include <ranges>
+#include <algorithm>
 
 namespace kota::grid {
 
@@ -58,13 +58,19 @@ CellStore::Levels CellStore::levels(ROWCOL row, ROWCOL col) const {
             own == 0 ? nullptr : &pool_[own]};
 }
 
+const CGXStyle* CellStore::uppermost(ROWCOL row, ROWCOL col, bool (CGXStyle::*has)() const) const {
+    const Levels all = levels(row, col);
+    const auto found = std::find_if(all.rbegin(), all.rend(),
+                                    [has](const CGXStyle* style) { return style && (style->*has)(); });
+    return found != all.rend() ? *found : nullptr;
+}
+
 std::string_view CellStore::text(ROWCOL row, ROWCOL col) const {
     const SmallText& own = columns_[col].values[row];
     if (own.isSet())
         return own.view();
-    for (const CGXStyle* const style : levels(row, col) | std::views::reverse)
-        if (style && style->HasValue())
-            return style->ValueText();
+    if (const CGXStyle* const style = uppermost(row, col, &CGXStyle::HasValue))
+        return style->ValueText();
     return isHeader(row, col) ? std::string_view() : standard_.ValueText();
 }
 
@@ -84,10 +90,8 @@ CGXStyle CellStore::compose(ROWCOL row, ROWCOL col) const {
 }
 
 bool CellStore::isReadOnly(ROWCOL row, ROWCOL col) const {
-    for (const CGXStyle* const style : levels(row, col) | std::views::reverse)
-        if (style && style->HasReadOnly())
-            return style->GetReadOnly();
-    return standard_.GetReadOnly();
+    const CGXStyle* const style = uppermost(row, col, &CGXStyle::HasReadOnly);
+    return (style ? *style : standard_).GetReadOnly();
 }
 
 void CellStore::layOverCell(ROWCOL row, ROWCOL col, const CGXStyle& style, ReadOnlyLock lock) {

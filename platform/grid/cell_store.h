@@ -69,6 +69,8 @@ private:
 
     std::size_t lines() const { return std::size_t{rows_} + 1; }
     Levels levels(ROWCOL row, ROWCOL col) const;
+    // The uppermost of these styles for which `has` holds; null when there is none.
+    const CGXStyle* uppermost(ROWCOL row, ROWCOL col, bool (CGXStyle::*has)() const) const;
     bool isReadOnly(ROWCOL row, ROWCOL col) const;
 
     ROWCOL rows_ = 0;

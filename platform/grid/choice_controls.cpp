@@ -36,8 +36,6 @@ void ChoiceControl::Init(ROWCOL row, ROWCOL col) {
     index_ = numberIn(value.View()) - base_;
     if (const auto entry = entryAt(list.View(), index_))
         SetCurrentText(CString(*entry));
-    else
-        index_ = -1;
 }
 
 bool ChoiceControl::TakeText(const char* text) {

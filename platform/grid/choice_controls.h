@@ -20,7 +20,7 @@ public:
 
 private:
     int base_;
-    int index_ = -1; // of the current text among the entries, -1 when it is none of them
+    int index_ = -1; // of the current text among the entries; below 0 when it is none
 };
 
 // A list of entries that are proposals for a free text.

@@ -13,7 +13,8 @@
 // Flags of SetCurrentCell.
 inline constexpr UINT GX_SCROLLINVIEW = 2;   // bring the cell into view
 inline constexpr UINT GX_DISPLAYEDITWND = 8; // bring it into view and redraw at once
-inline constexpr UINT GX_KEEPFOCUS = 32; // leave the focus where it is; without it the grid takes the focus
+inline constexpr UINT GX_KEEPFOCUS =
+    32; // leave the focus where it is; without it the grid takes it (MayTakeFocus)
 
 // Directions of MoveCurrentCell.
 inline constexpr int GX_UP = 1;

@@ -73,7 +73,7 @@ void CGXGridCore::GetSelectedRows(std::vector<ROWCOL>& rows) const {
                 rows.push_back(row);
     }
     std::ranges::sort(rows);
-    rows.erase(std::ranges::unique(rows).begin(), rows.end());
+    rows.erase(std::unique(rows.begin(), rows.end()), rows.end());
 }
 
 void CGXGridCore::OnChangedSelection() {}

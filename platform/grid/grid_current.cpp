@@ -36,10 +36,10 @@ constexpr std::array<Direction, 12> directions = {{
 // A number of lines or columns that reaches every edge.
 constexpr std::int64_t allTheWay = std::numeric_limits<ROWCOL>::max();
 
-// From the edge of what covers the current cell, `distance` further, within the bounds.
-ROWCOL moved(ROWCOL low, ROWCOL high, std::int64_t distance, ROWCOL first, ROWCOL last) {
-    const std::int64_t target = (distance < 0 ? std::int64_t{low} : std::int64_t{high}) + distance;
-    return static_cast<ROWCOL>(std::clamp<std::int64_t>(target, first, last));
+// From a line to the one `distance` beyond what covers it, `low` to `high`, within the bounds.
+ROWCOL moved(ROWCOL from, ROWCOL low, ROWCOL high, std::int64_t distance, ROWCOL first, ROWCOL last) {
+    const std::int64_t start = distance < 0 ? low : distance > 0 ? high : from;
+    return static_cast<ROWCOL>(std::clamp<std::int64_t>(start + distance, first, last));
 }
 
 } // namespace
@@ -62,7 +62,7 @@ BOOL CGXGridCore::SetCurrentCell(ROWCOL row, ROWCOL col, UINT flags) {
     data_->note(&kota::GridChanges::current);
     if (flags & (GX_SCROLLINVIEW | GX_DISPLAYEDITWND))
         data_->note(&kota::GridChanges::scroll);
-    if (!(flags & GX_KEEPFOCUS) && !data_->current.isNone() && GetSafeHwnd())
+    if (!(flags & GX_KEEPFOCUS) && !data_->current.isNone() && GetSafeHwnd() && MayTakeFocus())
         SetFocus();
     return TRUE;
 }
@@ -78,13 +78,13 @@ BOOL CGXGridCore::MoveCurrentCell(int direction, int count, BOOL /*update*/) {
     const std::int64_t distance = reach == Reach::Steps ? count : reach == Reach::Pages ? page : allTheWay;
     const CellPlace from = data_->current.isNone() ? first : data_->current;
     const CGXRange here = GetCoveredCellsRowCol(from.row, from.col);
-    CellPlace to{moved(here.top, here.bottom, rowStep * distance, first.row, last.row),
-                 moved(here.left, here.right, colStep * distance, first.col, last.col)};
+    CellPlace to{moved(from.row, here.top, here.bottom, rowStep * distance, first.row, last.row),
+                 moved(from.col, here.left, here.right, colStep * distance, first.col, last.col)};
     // A step goes on past cells that are not enabled, a jump comes back to the first that is.
-    const int back = reach == Reach::Steps ? 1 : -1;
-    while (to != data_->current && !data_->isEnabled(to)) {
-        const CellPlace next{moved(to.row, to.row, back * rowStep, first.row, last.row),
-                             moved(to.col, to.col, back * colStep, first.col, last.col)};
+    const std::int64_t back = reach == Reach::Steps ? 1 : -1;
+    while (!data_->isEnabled(to)) {
+        const CellPlace next{moved(to.row, to.row, to.row, back * rowStep, first.row, last.row),
+                             moved(to.col, to.col, to.col, back * colStep, first.col, last.col)};
         if (next == to)
             return FALSE;
         to = next;

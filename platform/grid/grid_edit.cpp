@@ -60,7 +60,6 @@ void CGXGridCore::Data::openEdit(CellPlace place) {
     CGXControl* const control = grid.GetControl(place.row, place.col);
     control->Init(place.row, place.col);
     control->SetModify(false);
-    control->SetDroppedDown(false);
     edit = {.control = control, .place = place, .textBefore = control->GetCurrentText()};
     ++edits;
     note(&kota::GridChanges::editing);
@@ -119,12 +118,12 @@ bool CGXGridCore::Data::commitEdit() {
         warningText.Empty();
         const bool valid = control->OnValidate();
         // Whoever was called may have ended the edit, or loaded it anew.
-        if (edits == thisEdit && !valid && control->GetModify()) {
+        if (!valid && control->GetModify()) {
             warning = {edit.place.row, edit.place.col, warningText};
             note(&kota::GridChanges::warned);
             return false;
         }
-        hasValue = edits == thisEdit && control->GetModify() && control->GetValue(value);
+        hasValue = control->GetModify() && control->GetValue(value);
     }
     if (edits != thisEdit)
         return true;

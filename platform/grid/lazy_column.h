@@ -27,7 +27,7 @@ public:
     void insert(std::size_t line, std::size_t count) {
         if (line >= lines_.size())
             return;
-        lines_.resize(lines_.size() + count);
+        grow(lines_.size() + count, lines_.size() + count);
         const auto gap = lines_.begin() + static_cast<std::ptrdiff_t>(line);
         std::move_backward(gap, lines_.end() - static_cast<std::ptrdiff_t>(count), lines_.end());
         std::generate_n(gap, count, [] { return T{}; });

@@ -17,7 +17,7 @@ public:
             putOnHeap(text);
             return;
         }
-        std::memcpy(bytes_.data(), text.data(), text.size());
+        text.copy(bytes_.data(), text.size()); // which may be none, from nowhere
         bytes_[capacity] = static_cast<char>(text.size());
     }
     SmallText(SmallText&& other) noexcept : bytes_(other.bytes_) { other.forget(); }

@@ -91,7 +91,7 @@ bool clickCell(CGXGridCore& grid, ROWCOL row, ROWCOL col) {
         if (!moveTo(data, place, GX_SCROLLINVIEW | GX_DISPLAYEDITWND))
             return false;
         data.select({});
-        if (data.current == place && data.isBelowHeaders(place))
+        if (data.current == place)
             data.toggle();
         return true;
     });
