@@ -18,13 +18,12 @@ IMPLEMENT_DYNCREATE(CKota0_adView, CFormView, kota0AdModule)
 CKota0_adView::CKota0_adView() : CFormView(DialogId::Form) {}
 
 CKota0_adView::~CKota0_adView() {
-    if (CKota0_adDoc* const document = GetDocument()) {
-        const CString title = document->GetTitle();
-        document->LeaveProject(this, title);
-        if (CWnd* const mainWindow = AfxGetMainWnd())
-            mainWindow->SendMessage(communicationMessage(), CommunicationCode::LocationChanged, 0);
-        document->DataChange(title);
-    }
+    if (CKota0_adDoc* const document = GetDocument())
+        document->LeaveProject(this, document->GetTitle());
+    if (CWnd* const mainWindow = AfxGetMainWnd())
+        mainWindow->SendMessage(communicationMessage(), CommunicationCode::LocationChanged, 0);
+    if (CKota0_adDoc* const document = GetDocument())
+        document->DataChange(document->GetTitle());
     compPage.reset();
     dispersPage.reset();
     k32DispersPage.reset();
@@ -96,7 +95,7 @@ void CKota0_adView::SetRiverColumns() {
 void CKota0_adView::OnUpdate(CView* sender, LPARAM hint, CObject* hintObject) {
     CFormView::OnUpdate(sender, hint, hintObject);
     CGenPropertyPage* const page = ActivePage();
-    if (!page)
+    if (!page || !GetSafeHwnd()) // what a closed window shows is out of date
         return;
     if (hint == UpdateHint::Store)
         page->StoreToDocument();
@@ -143,6 +142,8 @@ BOOL CKota0_adView::OnCmdMsg(UINT id, int notification) {
 }
 
 void CKota0_adView::OnGridSearch() {
+    if (!ActivePage())
+        return;
     const int tab = sheet->GetActiveIndex();
     if (tab == 0 || tab == 9)
         return;
@@ -150,7 +151,7 @@ void CKota0_adView::OnGridSearch() {
     const int noComponent = tab == 1 || tab == 4 || tab == 8;
     CSearchDlg dialog(searchComponent, searchText, searchChainage, searchChainageTest, searchTextTest,
                       noComponent, this);
-    if (dialog.DoModal() != IDOK)
+    if (dialog.DoModal() != IDOK || !GetSafeHwnd())
         return;
     searchNoComponent = noComponent;
     searchComponent = dialog.component;
@@ -163,6 +164,8 @@ void CKota0_adView::OnGridSearch() {
 }
 
 void CKota0_adView::OnGridFindNext() {
+    if (!ActivePage())
+        return;
     if (searchRow == 0)
         MessageBox(kota0AdModule().string(StringId::LastAlreadyFound));
     else
@@ -172,12 +175,12 @@ void CKota0_adView::OnGridFindNext() {
 void CKota0_adView::Search() {
     ActivePage()->SearchLine(searchNoComponent, searchRow, static_cast<unsigned>(searchComponent), searchText,
                              searchChainage, searchChainageTest, searchTextTest);
-    if (searchRow == 0)
+    if (searchRow == 0 && GetSafeHwnd())
         MessageBox(kota0AdModule().string(StringId::NotFound));
 }
 
 void CKota0_adView::OnGridGotoLine() {
     CGotoDlg dialog(this);
-    if (dialog.DoModal() == IDOK)
+    if (dialog.DoModal() == IDOK && GetSafeHwnd() && ActivePage())
         ActivePage()->GotoLine(static_cast<unsigned>(dialog.lineNumber));
 }

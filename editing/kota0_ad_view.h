@@ -65,6 +65,7 @@ private:
     void OnGridInsertProbe();
     void Search();
     void InsertOffered(const CK31_CBE_ModelDataItem& offered);
+    void StoreAndTell();
     // Tells the shell and the other views that the page in front has stored a change.
     void TellChange();
     void OnSiblingsCode(WPARAM code, const CKHComm_Package* package);

@@ -32,12 +32,15 @@ void CKota0_adView::GetRiverChoiceList(CString& out) {
         package.project = GetDocument()->projectHandle;
         const LRESULT answer = askShell(switchBoardMessage(), SwitchBoardCode::OfferRivers, package);
         const std::unique_ptr<CObList> rivers(reinterpret_cast<CObList*>(answer));
+        CString names;
         while (rivers && !rivers->IsEmpty()) {
             const std::unique_ptr<CObject> river(rivers->RemoveHead());
-            if (!riverChoiceList.IsEmpty())
-                riverChoiceList += '\n';
-            riverChoiceList += static_cast<const CK31_CBE_ModelDataItem&>(*river).riverName;
+            if (!names.IsEmpty())
+                names += '\n';
+            if (river)
+                names += static_cast<const CK31_CBE_ModelDataItem&>(*river).riverName;
         }
+        riverChoiceList = names;
     }
     out = riverChoiceList;
 }
@@ -72,26 +75,42 @@ void CKota0_adView::OnGridRowChanged(ROWCOL row) {
 }
 
 void CKota0_adView::TellChange() {
-    GetDocument()->DataChange(GetDocument()->GetTitle());
-    GetDocument()->UpdateAll(this, UpdateHint::Fill, nullptr);
+    // The shell may end the document meanwhile.
+    if (GetDocument())
+        GetDocument()->DataChange(GetDocument()->GetTitle());
+    if (GetDocument())
+        GetDocument()->UpdateAll(this, UpdateHint::Fill, nullptr);
 }
 
 void CKota0_adView::OnGridCellEdited(ROWCOL column) {
+    if (!ActivePage())
+        return;
     ActivePage()->StoreToDocument();
     const int tab = sheet->GetActiveIndex();
     const bool tabTells = tab == 2 || tab == 3 || tab == 5 || tab == 6 || tab == 7;
     if (column == 1 || column == 2 || tabTells)
         GetDocument()->DataChange(GetDocument()->GetTitle());
-    GetDocument()->UpdateAll(this, UpdateHint::Fill, nullptr);
+    if (GetDocument())
+        GetDocument()->UpdateAll(this, UpdateHint::Fill, nullptr);
 }
 
 void CKota0_adView::OnGridDeleteLine() {
+    if (!ActivePage())
+        return;
     ActivePage()->DeleteCurrentLine();
+    StoreAndTell();
+}
+
+void CKota0_adView::StoreAndTell() {
+    if (!GetSafeHwnd()) // the shell has closed the window meanwhile
+        return;
     ActivePage()->StoreToDocument();
     TellChange();
 }
 
 void CKota0_adView::OnGridInsertLine() {
+    if (!ActivePage())
+        return;
     const int tab = sheet->GetActiveIndex();
     if (tab == 0 || tab == 9) {
         ActivePage()->InsertDefaultLine();
@@ -101,6 +120,8 @@ void CKota0_adView::OnGridInsertLine() {
     package.project = GetDocument()->projectHandle;
     const LRESULT answer = askShell(switchBoardMessage(), SwitchBoardCode::OfferLocation, package);
     const std::unique_ptr<CK31_CBE_ModelDataItem> offered(reinterpret_cast<CK31_CBE_ModelDataItem*>(answer));
+    if (!GetSafeHwnd()) // the shell has closed the window meanwhile
+        return;
     if (offered)
         InsertOffered(*offered);
     else
@@ -114,8 +135,7 @@ void CKota0_adView::InsertOffered(const CK31_CBE_ModelDataItem& offered) {
     // The ".3" behind the conversion stays in the text, where every reader of numbers ignores it.
     const kota::NumberFormat format("%f.3");
     ActivePage()->InsertLocatedLine(offered.riverName, format(style.UnitConvertFromBase(chainage, 1)));
-    ActivePage()->StoreToDocument();
-    TellChange();
+    StoreAndTell();
 }
 
 void CKota0_adView::OnGridInsertProbe() {

@@ -92,6 +92,10 @@ CDecayPage::CDecayPage(CKota0_adDoc* owner) : CGridPage(owner, DialogId::Decay) 
 }
 CDecayPage::~CDecayPage() = default;
 
+int CDecayPage::ClearBlankDecayConstants() {
+    return CGridPage::RepairBlanks();
+}
+
 AD_Comp_RiverPos* CDecayPage::RecordFromRow(ROWCOL row) {
     const bool isGlobal = kota::textToInt(grid_.CellText(row, DecayColumn::Global)) != 0;
     if (grid_.GetRowCount() == 0 || !isGlobal)

@@ -15,6 +15,12 @@ public:
     // Of global lines alone, whose river name is blank.
     AD_Comp_RiverPos* RecordFromRow(ROWCOL row) override;
 
+protected:
+    int RepairBlanks() override { return ClearBlankDecayConstants(); }
+
 private:
+    // A blank decay constant becomes 0. Always 1.
+    int ClearBlankDecayConstants();
+
     CDecayGrid grid_;
 };

@@ -94,6 +94,10 @@ void CDispersPage::DoDataExchange(CDataExchange* exchange) {
     DDX_Control(exchange, ControlId::MaximumDispersion, maxCoefEdit);
 }
 
+int CDispersPage::ApplyGlobalsToBlankCells() {
+    return CGridPage::RepairBlanks();
+}
+
 bool CDispersPage::MayBeLeft() {
     const AD_Global_Var& globals = Document()->globalVar;
     if (!(globals.G_min_disp_coef > globals.G_max_disp_coef))

@@ -18,10 +18,14 @@ public:
     AD_Comp_RiverPos* RecordFromRow(ROWCOL row) override;
 
 protected:
+    int RepairBlanks() override { return ApplyGlobalsToBlankCells(); }
     // Not while the global minimum is above the maximum.
     bool MayBeLeft() override;
 
 private:
+    // A blank value becomes the global one, as a plain number. Always 1.
+    int ApplyGlobalsToBlankCells();
+
     CCtrlEdit dispFactorEdit;
     CCtrlEdit exponentEdit;
     CCtrlEdit minCoefEdit;

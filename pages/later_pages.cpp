@@ -42,13 +42,8 @@ CK32AddOutPage::CK32AddOutPage(CKota0_adDoc* owner)
     : CGenPropertyPage(owner, DialogId::K32AdditionalOutput) {}
 CK32AddOutPage::~CK32AddOutPage() = default;
 
-BOOL CAddOutput::OnSetActive() {
+void CAddOutput::PrepareGridMenu() {
     enableGridMenu(MF_GRAYED);
-    FillFromDocument(Document());
-    return CPropertyPage::OnSetActive();
 }
 
-BOOL CK32AddOutPage::OnSetActive() {
-    FillFromDocument(Document());
-    return CPropertyPage::OnSetActive();
-}
+void CK32AddOutPage::PrepareGridMenu() {}

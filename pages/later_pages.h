@@ -4,7 +4,8 @@
 #include "editing/base/gen_property_page.h"
 #include "pages/decay_grid.h"
 
-// The pages that are not available yet: each has its tab, its help and its grids, and shows a line of text.
+// The pages that are not available yet: each has its caption, its help and its grids, and shows a line of
+// text.
 
 class CK32DispersPage : public CGenPropertyPage {
     DECLARE_DYNAMIC(CK32DispersPage)
@@ -83,7 +84,9 @@ class CAddOutput : public CGenPropertyPage {
 public:
     explicit CAddOutput(CKota0_adDoc* owner);
     ~CAddOutput() override;
-    BOOL OnSetActive() override;
+
+protected:
+    void PrepareGridMenu() override;
 };
 
 // Leaves the menu as the page before left it.
@@ -92,5 +95,7 @@ class CK32AddOutPage : public CGenPropertyPage {
 public:
     explicit CK32AddOutPage(CKota0_adDoc* owner);
     ~CK32AddOutPage() override;
-    BOOL OnSetActive() override;
+
+protected:
+    void PrepareGridMenu() override;
 };

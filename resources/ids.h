@@ -22,6 +22,13 @@ inline constexpr UINT UnsupportedFileFormat = 4840;
 inline constexpr UINT EditorName = 4896;
 inline constexpr UINT ToolbarName = 4897;
 inline constexpr UINT SheetCaption = 4899;
+inline constexpr UINT InvalidValue = 4828;
+inline constexpr UINT ErrorInChainage = 4907;
+// The page that a data change of a sibling cannot be shown on: Layer, Init, Sediment, Non Cohesive,
+// Decay, Dispersion, Ice Data, Boundary.
+inline constexpr UINT DeletedBehindError = 4873;  // and the seven that follow
+inline constexpr UINT InsertedBehindError = 4881; // and the six that follow: none for a layer
+inline constexpr UINT CannotSelect = 4888;        // and the seven that follow
 inline constexpr UINT ProbeRiver = 4903;
 inline constexpr UINT IntegerBetween = 4906; // %d, %d: the bounds
 inline constexpr UINT SearchPrompt = 42550;

@@ -67,12 +67,11 @@ void CCtrlEdit::TakeText() {
         return;
     }
     const double value = style_.UnitConvertFromBase(kota::textToDouble(text.View()), 0);
-    if (value != *target) {
-        *target = value;
-        TellDocument();
-    }
+    const bool changed = value != *target;
     *target = value;
     ShowTarget();
+    if (changed)
+        TellDocument();
 }
 
 void CCtrlEdit::TellDocument() {

@@ -106,6 +106,15 @@ void CGenGrid::OnModifyCell(ROWCOL row, ROWCOL col) {
     CGXGridWnd::OnModifyCell(row, col);
 }
 
+bool CGenGrid::LetFocusGo() {
+    if (!cellEdited)
+        return CGXGridWnd::LetFocusGo();
+    ROWCOL row = 0;
+    ROWCOL col = 0;
+    GetCurrentCell(&row, &col);
+    return SetCurrentCell(row, col, GX_KEEPFOCUS) && !IsEditPending();
+}
+
 BOOL CGenGrid::OnStartEditing(ROWCOL /*row*/, ROWCOL col) {
     GridOwner* const owner = Owner();
     if (riverColumn == 0 || col != riverColumn || !owner)

@@ -43,6 +43,8 @@ public:
     BOOL ProcessKeys(CWnd* window, UINT message, UINT key, UINT repeat, UINT flags) override;
     BOOL OnStartEditing(ROWCOL row, ROWCOL col) override;
     void OnModifyCell(ROWCOL row, ROWCOL col) override;
+    // What was modified is reported before the focus goes.
+    bool LetFocusGo() override;
 
 protected:
     CGenPropertyPage* OwnerPage() const { return ownerPage; }

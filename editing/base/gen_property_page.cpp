@@ -27,9 +27,13 @@ BOOL CGenPropertyPage::OnInitDialog() {
 }
 
 BOOL CGenPropertyPage::OnSetActive() {
-    enableGridMenu(MF_ENABLED);
+    PrepareGridMenu();
     FillFromDocument(document);
     return CPropertyPage::OnSetActive();
+}
+
+void CGenPropertyPage::PrepareGridMenu() {
+    enableGridMenu(MF_ENABLED);
 }
 
 BOOL CGenPropertyPage::OnCmdMsg(UINT id, int notification) {

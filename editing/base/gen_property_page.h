@@ -23,8 +23,7 @@ public:
     bool IsInitialised() const { return pageInitialised != 0; }
 
     BOOL OnInitDialog() override;
-    // A page with a grid enables the main menu's third entry, shows the document's present state and comes to
-    // the front.
+    // Prepares the menu, shows the document's present state and comes to the front.
     BOOL OnSetActive() override;
     BOOL OnCmdMsg(UINT id, int notification) override;
 
@@ -55,6 +54,8 @@ public:
     virtual CGenGrid* GetActiveGrid();
 
 protected:
+    // Enables the main menu's third entry, that of the grids.
+    virtual void PrepareGridMenu();
     CKota0_adDoc* Document() const { return document; }
     // "Undefined" and the names of the components that pass the filter: the entries of a component column.
     CString ComponentColumnChoices(int kindFilter);

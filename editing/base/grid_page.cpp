@@ -36,10 +36,16 @@ BOOL CGridPage::OnInitDialog() {
 }
 
 BOOL CGridPage::OnKillActive() {
-    for (const auto& part : parts_)
-        part->FillBlanks(Document()->globalVar);
+    if (!RepairBlanks())
+        return FALSE;
     StoreToDocument();
     return MayBeLeft() && CGenPropertyPage::OnKillActive();
+}
+
+int CGridPage::RepairBlanks() {
+    for (const auto& part : parts_)
+        part->FillBlanks(Document()->globalVar);
+    return 1;
 }
 
 bool CGridPage::MayBeLeft() {
@@ -98,6 +104,8 @@ void CGridPage::FillFromDocument(CKota0_adDoc* source) {
 }
 
 void CGridPage::StoreToDocument() {
+    if (!IsInitialised()) // the document is the only truth
+        return;
     for (const auto& part : parts_)
         part->StoreLines(*Document());
 }

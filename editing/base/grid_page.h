@@ -32,6 +32,8 @@ protected:
     CGridPage(CKota0_adDoc* owner, UINT dialogId);
     // Called by the constructors, in the order of the grids on the page.
     void AddPart(std::unique_ptr<GridPart> part);
+    // Gives blank cells the values that the tables have for them. 0: the page stays.
+    virtual int RepairBlanks();
     // Whether the page's rules let it be left, asked after the lines were stored. One that refuses tells why.
     virtual bool MayBeLeft();
     // The part of the active grid: the first one, where the page has one alone; null for none of them.

@@ -15,6 +15,18 @@ CGXStyle readOnly(bool locked) {
     return CGXStyle().SetReadOnly(locked);
 }
 
+// Lifts a grid's read-only lock for as long as a block runs.
+class Unlocked {
+public:
+    explicit Unlocked(CGenGrid& grid) : param_(*grid.GetParam()) { param_.SetLockReadOnly(FALSE); }
+    ~Unlocked() { param_.SetLockReadOnly(TRUE); }
+    Unlocked(const Unlocked&) = delete;
+    Unlocked& operator=(const Unlocked&) = delete;
+
+private:
+    CGXGridParam& param_;
+};
+
 } // namespace
 
 GridPart::GridPart(const GridFace& face, CGenGrid& grid, UnitStyles& styles)
@@ -70,9 +82,16 @@ void GridPart::SetDefault(ROWCOL row, const ColumnFace& column, const CellDefaul
         grid_.SetValueRange(CGXRange(row, column.id), value.global(globals));
 }
 
-void GridPart::AddDefaultLine(const AD_Global_Var& globals) {
+ROWCOL GridPart::AddLine() {
+    const ROWCOL line = grid_.GetRowCount() + 1;
     grid_.InsertLine();
-    const ROWCOL line = grid_.GetRowCount();
+    return grid_.GetRowCount() == line ? line : 0;
+}
+
+void GridPart::AddDefaultLine(const AD_Global_Var& globals) {
+    const ROWCOL line = AddLine();
+    if (line == 0)
+        return;
     for (std::size_t i = 0; i < ColumnCount(); ++i)
         SetDefault(line, ColumnAt(i), ColumnAt(i).newLine, globals);
     if (face_.globalColumn != 0)
@@ -81,8 +100,9 @@ void GridPart::AddDefaultLine(const AD_Global_Var& globals) {
 
 void GridPart::AddLocatedLine(const AD_Global_Var& globals, const CString& riverName,
                               const CString& chainage) {
-    grid_.InsertLine();
-    const ROWCOL line = grid_.GetRowCount();
+    const ROWCOL line = AddLine();
+    if (line == 0)
+        return;
     for (std::size_t i = 0; i < ColumnCount(); ++i) {
         const ColumnFace& column = ColumnAt(i);
         SetDefault(line, column, column.newLocated, globals);
@@ -109,11 +129,10 @@ void GridPart::LockPlace(ROWCOL row) {
 }
 
 void GridPart::OpenPlace(ROWCOL row) {
-    grid_.GetParam()->SetLockReadOnly(FALSE);
+    const Unlocked scope(grid_);
     for (std::size_t i = 0; i < ColumnCount(); ++i)
         if (ColumnAt(i).place != Place::None)
             grid_.SetStyleRange(CGXRange(row, ColumnAt(i).id), readOnly(false));
-    grid_.GetParam()->SetLockReadOnly(TRUE);
 }
 
 void GridPart::ApplyGlobalBox(ROWCOL row, ROWCOL col) {

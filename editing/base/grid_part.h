@@ -49,6 +49,8 @@ protected:
     void OpenPlace(ROWCOL row);
 
 private:
+    // Adds a line and gives its number; 0 when others changed the lines meanwhile.
+    ROWCOL AddLine();
     void SetUpColumn(const ColumnFace& column);
     void SetDefault(ROWCOL row, const ColumnFace& column, const CellDefault& value,
                     const AD_Global_Var& globals);

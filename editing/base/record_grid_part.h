@@ -1,6 +1,7 @@
 #pragma once
 
 #include "document/kota0_ad_doc.h"
+#include "document/records/comp_river_pos.h"
 #include "editing/base/grid_part.h"
 #include "platform/framework/number_text.h"
 
@@ -37,9 +38,7 @@ public:
         const ROWCOL count = Grid().GetRowCount();
         for (ROWCOL line = Face().firstLine; line <= count; ++line) {
             auto record = std::make_unique<Record>();
-            for (const Column<Record>& column : columns_)
-                StoreCell(line, column, *record);
-            Complete(*record, line);
+            StoreLine(line, *record);
             list.AddTail(record.release());
         }
     }
@@ -48,21 +47,29 @@ protected:
     std::size_t ColumnCount() const override { return columns_.size(); }
     const ColumnFace& ColumnAt(std::size_t index) const override { return columns_[index].face; }
 
-    // Fills in what no column holds.
-    virtual void Complete(Record& /*record*/, ROWCOL /*line*/) const {}
-
-private:
     void FillLine(ROWCOL line, const Record& record) {
         const bool isGlobal = HoldsEverywhere(record);
         for (const Column<Record>& column : columns_)
             if (!isGlobal || column.face.place == Place::None)
                 FillCell(line, column, record);
-        if (isGlobal)
+        StyleLine(line, record);
+    }
+    // What the values of a line that was filled open and lock: the place goes with the "Global" box.
+    virtual void StyleLine(ROWCOL line, const Record& record) {
+        if (HoldsEverywhere(record))
             LockPlace(line);
         else if (Face().globalColumn != 0)
             OpenPlace(line);
     }
+    void StoreLine(ROWCOL line, Record& record) const {
+        for (const Column<Record>& column : columns_)
+            StoreCell(line, column, record);
+        Complete(record, line);
+    }
+    // Fills in what no column holds.
+    virtual void Complete(Record& /*record*/, ROWCOL /*line*/) const {}
 
+private:
     bool HoldsEverywhere(const Record& record) const {
         if constexpr (std::is_base_of_v<AD_Comp_RiverPos, Record>)
             return Face().globalColumn != 0 && record.isGlobal != 0;
