@@ -1,0 +1,54 @@
+#include "hub/screen/cell_editor.h"
+
+namespace kota::hub {
+
+QWidget* CellEditor::open(CellKind kind, Qt::Alignment alignment, QWidget* parent) {
+    close();
+    if (kind == CellKind::Choice || kind == CellKind::FreeChoice) {
+        widget_ = box_ = new DropBox;
+        box_->setParent(parent);
+        box_->setEditable(kind == CellKind::FreeChoice);
+        box_->setInsertPolicy(QComboBox::NoInsert);
+        line_ = box_->lineEdit();
+        if (line_)
+            line_->setCompleter(nullptr);
+    } else {
+        widget_ = line_ = new QLineEdit(parent);
+        line_->setFrame(false);
+    }
+    if (line_)
+        line_->setAlignment(alignment);
+    widget_->setAutoFillBackground(true);
+    focusTarget()->setFocusPolicy(Qt::TabFocus);
+    return widget_;
+}
+
+QWidget* CellEditor::focusTarget() const {
+    return line_ ? static_cast<QWidget*>(line_) : widget_.data();
+}
+
+QString CellEditor::text() const {
+    return line_ ? line_->text() : box_ ? box_->currentText() : QString();
+}
+
+void CellEditor::setText(const QString& text) {
+    if (box_ && !line_)
+        box_->setCurrentIndex(box_->findText(text, Qt::MatchExactly | Qt::MatchCaseSensitive));
+    else if (line_ && line_->text() != text)
+        line_->setText(text);
+}
+
+void CellEditor::setEntries(const QStringList& entries) {
+    if (!box_)
+        return;
+    box_->clear();
+    box_->addItems(entries);
+}
+
+void CellEditor::close() {
+    widget_ = nullptr;
+    line_ = nullptr;
+    box_ = nullptr;
+}
+
+} // namespace kota::hub

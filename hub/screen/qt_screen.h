@@ -1,0 +1,42 @@
+#pragma once
+
+#include "hub/screen/parts.h"
+#include "platform/framework/screen.h"
+
+#include <QTimer>
+
+#include <functional>
+#include <vector>
+
+namespace kota::hub {
+
+// Draws the platform's windows with Qt. Needs a QApplication, and outlives no part of it.
+class QtScreen : public Screen {
+public:
+    QtScreen();
+    ~QtScreen() override;
+
+    // Makes a window of the desktop for a window of the platform, not yet shown. It deletes itself when that
+    // one is gone, or else with the screen.
+    QWidget* makeWindow(const CWnd& window);
+    // The widget of a window; null when it is not on the screen.
+    QWidget* widgetOf(const CWnd& window) const;
+
+    int showMessageBox(const MessageBoxRequest& request) override;
+    std::optional<CString> askSaveName(const CString& proposal) override;
+    void showDialog(CDialog& dialog) override;
+    void windowsChanged(std::span<const WindowChange> changes) override;
+    void changesPending() override;
+
+private:
+    QWidget* desktopWindowOf(HWND window) const;
+    void afterAction();
+
+    InputQueue queue_;
+    Parts parts_;
+    std::vector<QPointer<QWidget>> windows_;
+    std::function<void()> leaveDialog_; // of the innermost dialog: leaves its event loop if it is ended
+    QTimer nextTurn_;                   // runs while changes wait outside a turn
+};
+
+} // namespace kota::hub
