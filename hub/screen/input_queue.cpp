@@ -13,6 +13,7 @@ void InputQueue::add(Action action) {
 }
 
 void InputQueue::schedule() {
+    // NOLINTNEXTLINE(clang-analyzer-cplusplus.NewDeleteLeaks): the event loop deletes the call it is given
     QMetaObject::invokeMethod(this, &InputQueue::drain, Qt::QueuedConnection);
 }
 
