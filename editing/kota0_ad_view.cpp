@@ -82,14 +82,11 @@ void CKota0_adView::MakePages() {
 }
 
 void CKota0_adView::SetRiverColumns() {
-    dispersPage->Grid().SetRiverColumn(1);
-    k32DispersPage->Grid().SetRiverColumn(1);
-    initPage->UpperGrid().SetRiverColumn(4);
-    initPage->LowerGrid().SetRiverColumn(9);
-    decayPage->Grid().SetRiverColumn(4);
-    globalPage->Grid().SetRiverColumn(4);
-    layerPage->LocationGrid().SetRiverColumn(8);
-    nonCohesPage->Grid().SetRiverColumn(5);
+    CGenPropertyPage* const pages[] = {dispersPage.get(), k32DispersPage.get(), initPage.get(),
+                                       decayPage.get(),   globalPage.get(),     layerPage.get(),
+                                       nonCohesPage.get()};
+    for (CGenPropertyPage* page : pages)
+        page->SetRiverColumns();
 }
 
 void CKota0_adView::OnUpdate(CView* sender, LPARAM hint, CObject* hintObject) {

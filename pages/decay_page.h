@@ -10,8 +10,6 @@ public:
     explicit CDecayPage(CKota0_adDoc* owner);
     ~CDecayPage() override;
 
-    CDecayGrid& Grid() { return grid_; }
-
     // Of global lines alone, whose river name is blank.
     AD_Comp_RiverPos* RecordFromRow(ROWCOL row) override;
 

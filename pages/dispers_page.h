@@ -10,8 +10,6 @@ public:
     explicit CDispersPage(CKota0_adDoc* owner);
     ~CDispersPage() override;
 
-    CGenGrid& Grid() { return grid_; }
-
     void DoDataExchange(CDataExchange* exchange) override;
     void FillFromDocument(CKota0_adDoc* source) override;
     // With the place alone; a blank chainage comes as 0.

@@ -1,21 +1,14 @@
 #pragma once
 
-#include "editing/base/gen_grid.h"
 #include "editing/base/gen_property_page.h"
-#include "pages/decay_grid.h"
 
-// The pages that are not available yet: each has its caption, its help and its grids, and shows a line of
-// text.
+// The pages that are not available yet: each has its caption and its help, and shows a line of text.
 
 class CK32DispersPage : public CGenPropertyPage {
     DECLARE_DYNAMIC(CK32DispersPage)
 public:
     explicit CK32DispersPage(CKota0_adDoc* owner);
     ~CK32DispersPage() override;
-    CGenGrid& Grid() { return grid_; }
-
-private:
-    CGenGrid grid_;
 };
 
 class CInitPage : public CGenPropertyPage {
@@ -23,12 +16,6 @@ class CInitPage : public CGenPropertyPage {
 public:
     explicit CInitPage(CKota0_adDoc* owner);
     ~CInitPage() override;
-    CDecayGrid& UpperGrid() { return upperGrid_; }
-    CDecayGrid& LowerGrid() { return lowerGrid_; }
-
-private:
-    CDecayGrid upperGrid_;
-    CDecayGrid lowerGrid_;
 };
 
 class CBoundPage : public CGenPropertyPage {
@@ -50,10 +37,6 @@ class CGlobalPage : public CGenPropertyPage {
 public:
     explicit CGlobalPage(CKota0_adDoc* owner);
     ~CGlobalPage() override;
-    CGenGrid& Grid() { return grid_; }
-
-private:
-    CGenGrid grid_;
 };
 
 class CLayerPage : public CGenPropertyPage {
@@ -61,10 +44,6 @@ class CLayerPage : public CGenPropertyPage {
 public:
     explicit CLayerPage(CKota0_adDoc* owner);
     ~CLayerPage() override;
-    CGenGrid& LocationGrid() { return locationGrid_; }
-
-private:
-    CGenGrid locationGrid_;
 };
 
 class CNonCohesPage : public CGenPropertyPage {
@@ -72,10 +51,6 @@ class CNonCohesPage : public CGenPropertyPage {
 public:
     explicit CNonCohesPage(CKota0_adDoc* owner);
     ~CNonCohesPage() override;
-    CGenGrid& Grid() { return grid_; }
-
-private:
-    CGenGrid grid_;
 };
 
 // Greys the Grid menu, since it has no grid.

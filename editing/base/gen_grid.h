@@ -33,7 +33,6 @@ public:
 
     // The column that offers the project's river names; 0 for none. Takes effect in SetupGrid.
     void SetRiverColumn(ROWCOL column) { riverColumn = column; }
-    ROWCOL GetRiverColumn() const { return riverColumn; }
     // After a fill: back to the cell that was current, to the last line if that is gone, to the first line
     // if there was none.
     void RestoreCurrentCell(ROWCOL firstLine);

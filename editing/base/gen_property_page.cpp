@@ -60,6 +60,7 @@ void CGenPropertyPage::FillFromDocument(CKota0_adDoc* source) {
 }
 
 void CGenPropertyPage::StoreToDocument() {}
+void CGenPropertyPage::SetRiverColumns() {}
 void CGenPropertyPage::OnRowColumnChanged(ROWCOL /*row*/, ROWCOL /*col*/) {}
 
 AD_Comp_RiverPos* CGenPropertyPage::RecordFromRow(ROWCOL /*row*/) {

@@ -39,6 +39,8 @@ public:
                             double chainage, int chainageTest, int textTest);
     virtual void FillFromDocument(CKota0_adDoc* source);
     virtual void StoreToDocument();
+    // Tells the grids which of their columns takes the project's river names.
+    virtual void SetRiverColumns();
     // The cell that decides on others of its line has changed.
     virtual void OnRowColumnChanged(ROWCOL row, ROWCOL col);
     // The record of a grid line as far as its place goes, for the caller to delete; null when there is none.

@@ -110,6 +110,11 @@ void CGridPage::StoreToDocument() {
         part->StoreLines(*Document());
 }
 
+void CGridPage::SetRiverColumns() {
+    for (const auto& part : parts_)
+        part->SetRiverColumn();
+}
+
 void CGridPage::OnRowColumnChanged(ROWCOL row, ROWCOL col) {
     GridPart* const part = ActivePart();
     if (part && part->Face().globalColumn != 0)

@@ -25,6 +25,7 @@ public:
                     int chainageTest, int textTest) override;
     void FillFromDocument(CKota0_adDoc* source) override;
     void StoreToDocument() override;
+    void SetRiverColumns() override;
     // The "Global" box of a line.
     void OnRowColumnChanged(ROWCOL row, ROWCOL col) override;
 

@@ -149,6 +149,11 @@ const ColumnFace* GridPart::ColumnOf(Place place) const {
     return nullptr;
 }
 
+void GridPart::SetRiverColumn() {
+    if (const ColumnFace* const column = ColumnOf(Place::River))
+        grid_.SetRiverColumn(column->id);
+}
+
 CString GridPart::RiverNameOf(ROWCOL row) const {
     const ColumnFace* const column = ColumnOf(Place::River);
     return column ? CString(grid_.CellText(row, column->id)) : CString();

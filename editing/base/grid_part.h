@@ -23,6 +23,8 @@ public:
     // Takes the dialog's control over and builds columns and headings, undo off.
     void SetUp(CGenPropertyPage& page);
     void SetComponentChoices(const CString& choices);
+    // Has the column of the river names offer the project's rivers.
+    void SetRiverColumn();
     // Whether the document has records for the grid.
     virtual bool HasRecords(const CKota0_adDoc& document) const = 0;
     // A line for each record, with its values.

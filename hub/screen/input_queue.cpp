@@ -1,5 +1,8 @@
 #include "hub/screen/input_queue.h"
 
+#include <QCoreApplication>
+#include <QEvent>
+
 #include <iterator>
 #include <utility>
 
@@ -13,8 +16,11 @@ void InputQueue::add(Action action) {
 }
 
 void InputQueue::schedule() {
-    // NOLINTNEXTLINE(clang-analyzer-cplusplus.NewDeleteLeaks): the event loop deletes the call it is given
-    QMetaObject::invokeMethod(this, &InputQueue::drain, Qt::QueuedConnection);
+    QCoreApplication::postEvent(this, new QEvent(QEvent::User));
+}
+
+void InputQueue::customEvent(QEvent* /*event*/) {
+    drain();
 }
 
 void InputQueue::drain() {

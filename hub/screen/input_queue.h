@@ -18,6 +18,8 @@ public:
 
     void add(Action action);
 
+    void customEvent(QEvent* event) override;
+
     // While one lives, what stood in the queue before waits. For boxes and dialogs, which run an event loop
     // of their own.
     class Level {

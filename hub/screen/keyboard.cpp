@@ -82,7 +82,7 @@ void Keyboard::watch(QWidget& widget) {
 }
 
 void Keyboard::pass(QWidget& widget, QEvent& event) {
-    const FlagScope scope(passing_);
+    const ValueScope scope(passing_, true);
     QCoreApplication::sendEvent(&widget, &event);
 }
 

@@ -1,10 +1,10 @@
 #include "platform/framework/frame.h"
 #include "platform/framework/guard.h"
+#include "platform/framework/scope.h"
 #include "platform/framework/turn.h"
 #include "platform/framework/window.h"
 #include "platform/framework/window_registry.h"
 
-#include <utility>
 
 namespace {
 
@@ -48,9 +48,10 @@ HWND SetFocus(HWND handle) {
     theFocus = nullptr;
     if (leaving)
         kota::noteChange(leaving, kota::Change::Focus);
-    const HWND nextBefore = std::exchange(nextFocus, handle);
-    SendMessage(leaving, WM_KILLFOCUS, reinterpret_cast<WPARAM>(handle), 0);
-    nextFocus = nextBefore;
+    {
+        const kota::ValueScope onItsWay(nextFocus, handle);
+        SendMessage(leaving, WM_KILLFOCUS, reinterpret_cast<WPARAM>(handle), 0);
+    }
     // The old holder may have closed or disabled the new one, or given the focus elsewhere, on its way out.
     if (theFocus || !canTakeFocus(handle))
         return previous;

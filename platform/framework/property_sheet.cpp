@@ -51,7 +51,7 @@ BOOL CPropertySheet::Create(CWnd* parent, unsigned style, unsigned extendedStyle
     kota::createTabs(GetSafeHwnd(), AFX_IDC_TAB_CONTROL, std::move(captions));
     GetTabControl()->SetWindowRect(nominalRect);
     OnInitDialog();
-    const kota::FlagScope change(changing_);
+    const kota::ValueScope change(changing_, true);
     if (!pages_.empty())
         ShowPage(0);
     return TRUE;
@@ -83,7 +83,7 @@ BOOL CPropertySheet::SetActivePage(int index) {
         return FALSE;
     if (index == active_)
         return TRUE;
-    const kota::FlagScope change(changing_);
+    const kota::ValueScope change(changing_, true);
     if (!LeaveActivePage() || !GetSafeHwnd())
         return FALSE;
     ShowPage(index);

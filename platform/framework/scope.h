@@ -4,17 +4,18 @@
 
 namespace kota {
 
-// Sets a flag for as long as a block runs, however it ends.
-class FlagScope {
+// Gives a variable another value for as long as a block runs, however it ends.
+template <class Value>
+class ValueScope {
 public:
-    explicit FlagScope(bool& flag) : flag_(flag), before_(std::exchange(flag, true)) {}
-    ~FlagScope() { flag_ = before_; }
-    FlagScope(const FlagScope&) = delete;
-    FlagScope& operator=(const FlagScope&) = delete;
+    ValueScope(Value& place, Value value) : place_(place), before_(std::exchange(place, value)) {}
+    ~ValueScope() { place_ = before_; }
+    ValueScope(const ValueScope&) = delete;
+    ValueScope& operator=(const ValueScope&) = delete;
 
 private:
-    bool& flag_;
-    bool before_;
+    Value& place_;
+    Value before_;
 };
 
 } // namespace kota

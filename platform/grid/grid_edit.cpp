@@ -110,7 +110,7 @@ bool CGXGridCore::Data::commitEdit() {
         return true;
     if (validating)
         return false;
-    const kota::FlagScope scope(validating);
+    const kota::ValueScope scope(validating, true);
     const unsigned thisEdit = edits;
     CString value;
     bool hasValue = false;
