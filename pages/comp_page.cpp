@@ -81,6 +81,8 @@ void CCompPage::FillFromDocument(CKota0_adDoc* source) {
 }
 
 void CCompPage::StoreToDocument() {
+    if (!IsInitialised())
+        return;
     UpdateData(TRUE);
     if (grid_.GetRowCount() == 1 && grid_.CellText(1, ComponentColumn::Name).empty())
         Document()->compList.DeleteAll();

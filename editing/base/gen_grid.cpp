@@ -164,6 +164,8 @@ void CGenGrid::StepForward() {
         MoveCurrentCell(GX_DOWN);
     } else if (GridOwner* const owner = Owner()) {
         owner->OnGridInsertLine();
+        if (!IsWindowVisible()) // the shell may have brought another tab to the front
+            return;
         MoveCurrentCell(GX_MOSTLEFT);
         MoveCurrentCell(GX_BOTTOM);
         BringWindowToTop();

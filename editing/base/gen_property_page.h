@@ -19,8 +19,8 @@ public:
     CGenPropertyPage(CKota0_adDoc* owner, UINT dialogId);
     ~CGenPropertyPage() override;
 
-    // Whether the page's window and grids exist.
-    bool IsInitialised() const { return pageInitialised != 0; }
+    // Whether the page's window and grids exist: not before it was shown, and not when it was closed.
+    bool IsInitialised() const { return pageInitialised != 0 && GetSafeHwnd(); }
 
     BOOL OnInitDialog() override;
     // Prepares the menu, shows the document's present state and comes to the front.

@@ -28,13 +28,11 @@ QWidget* CellEditor::focusTarget() const {
 }
 
 QString CellEditor::text() const {
-    return line_ ? line_->text() : box_ ? box_->currentText() : QString();
+    return line_ ? line_->text() : QString();
 }
 
 void CellEditor::setText(const QString& text) {
-    if (box_ && !line_)
-        box_->setCurrentIndex(box_->findText(text, Qt::MatchExactly | Qt::MatchCaseSensitive));
-    else if (line_ && line_->text() != text)
+    if (line_ && line_->text() != text)
         line_->setText(text);
 }
 

@@ -26,6 +26,7 @@ public:
     // What takes the keys.
     QWidget* focusTarget() const;
 
+    // Of the line of text; empty and without effect where there is none.
     QString text() const;
     void setText(const QString& text);
     void setEntries(const QStringList& entries);

@@ -21,7 +21,10 @@ grid::Selecting selectingBy(Qt::KeyboardModifiers held) {
 QStringList entriesOf(const CGXGridCore& grid, const QModelIndex& index) {
     CGXStyle style;
     grid.ComposeStyleRowCol(GridModel::rowOf(index), GridModel::colOf(index), &style);
-    return toQt(style.GetChoiceList()).remove('\r').split('\n', Qt::SkipEmptyParts);
+    QStringList entries = toQt(style.GetChoiceList()).remove('\r').split('\n');
+    if (entries.last().isEmpty()) // each entry is ended by a line feed, which the last one may lack
+        entries.removeLast();
+    return entries;
 }
 
 } // namespace
@@ -114,8 +117,7 @@ bool GridPart::takeKey(QKeyEvent& key) {
 bool GridPart::takeEditorKey(CGXGridCore& grid, QKeyEvent& key) {
     const int step = key.key() == Qt::Key_Down ? 1 : key.key() == Qt::Key_Up ? -1 : 0;
     if (editor_.box() && step != 0) {
-        const qsizetype chosen = entriesOf(grid, editedAt_).indexOf(editor_.text());
-        grid::chooseEntry(grid, static_cast<int>(chosen) + step);
+        grid::chooseEntry(grid, grid::chosenEntry(grid) + step);
         return true;
     }
     if (!editor_.line())
@@ -145,10 +147,8 @@ bool GridPart::typeOver(CGXGridCore& grid, const QString& text) {
 
 // The next entry that begins with the text, from the one that is chosen, round the end.
 bool GridPart::chooseByLetter(CGXGridCore& grid, const QString& text) {
-    const QModelIndex current = model_.currentIndex();
-    const QStringList entries = entriesOf(grid, current);
-    const QString shown = model_.look(GridModel::rowOf(current), GridModel::colOf(current)).text;
-    const qsizetype chosen = entries.indexOf(shown);
+    const QStringList entries = entriesOf(grid, model_.currentIndex());
+    const int chosen = grid::chosenEntry(grid);
     for (qsizetype i = 1; i <= entries.size(); ++i) {
         const qsizetype place = (chosen + i) % entries.size();
         if (entries[place].startsWith(text, Qt::CaseInsensitive))
@@ -241,7 +241,9 @@ void GridPart::showEditor(const CGXGridCore& grid) {
     }
     if (isNew)
         view().openPersistentEditor(edited);
-    if (!composing_)
+    if (editor_.box() && !editor_.line())
+        editor_.box()->setCurrentIndex(grid::chosenEntry(grid));
+    else if (!composing_)
         editor_.setText(model_.look(GridModel::rowOf(edited), GridModel::colOf(edited)).text);
     if (isNew && editor_.line() && !grid.IsEditPending())
         editor_.line()->selectAll();

@@ -71,7 +71,10 @@ BOOL CKhDoc::DoSave(const char* path) {
         name = *chosen;
     }
     CString problem;
+    const HWND focus = ::GetFocus();
     const BOOL saved = SaveKeeping(name, problem);
+    if (!::GetFocus()) // which a save takes away
+        ::SetFocus(focus);
     if (!problem.IsEmpty())
         AfxMessageBox(problem);
     return saved;

@@ -56,8 +56,20 @@ void CDocument::RemoveView(CView* view) {
 }
 
 void CDocument::OnCloseDocument() {
-    for (CView* view : std::exchange(views_, {}))
-        view->document_ = nullptr;
+    // A view in a frame takes leave when it ends, and the last one calls this again.
+    const std::vector<CView*> present = views_;
+    for (CView* view : present) {
+        if (std::ranges::find(views_, view) == views_.end())
+            continue;
+        if (CFrameWnd* const frame = view->GetParentFrame()) {
+            frame->DestroyWindow();
+        } else {
+            std::erase(views_, view);
+            view->document_ = nullptr;
+        }
+    }
+    if (!views_.empty())
+        return;
     DeleteContents();
     delete this;
 }
@@ -66,7 +78,14 @@ BOOL CDocument::TakePendingInput() {
     CWnd* const focus = CWnd::GetFocus();
     const bool isHere =
         focus && std::ranges::any_of(views_, [&](const CView* view) { return view->IsChild(focus); });
-    return !isHere || focus->LetFocusGo();
+    if (!isHere)
+        return TRUE;
+    const HWND holder = focus->GetSafeHwnd();
+    ::SetFocus(nullptr);
+    const bool taken = ::GetFocus() != holder;
+    if (!::GetFocus())
+        ::SetFocus(holder);
+    return taken;
 }
 
 BOOL CDocument::CanCloseFrame(CFrameWnd* frame) {
@@ -111,12 +130,8 @@ void CDocument::OnFileSaveAs() {
 }
 
 void CDocument::OnFileClose() {
-    if (!SaveModified())
-        return;
-    const std::vector<CView*> present = views_;
-    for (CView* view : present)
-        if (CFrameWnd* const frame = view->GetParentFrame())
-            frame->DestroyWindow();
+    if (TakePendingInput() && SaveModified())
+        OnCloseDocument();
 }
 
 BOOL CDocument::SaveModified() {

@@ -50,7 +50,8 @@ public:
 
     // Saves under `path`, or under a name asked for when it is empty. 1 done.
     virtual BOOL DoSave(const char* path) = 0;
-    // Ends a document that a template made: empties and deletes it. The last view that leaves it does this.
+    // Ends a document that a template made: closes the frames of its views, and empties and deletes it when
+    // the last view has left.
     virtual void OnCloseDocument();
     // Whether a frame of the document may be closed: not when it is the last one and the user, asked about
     // changes, wants to stay.

@@ -1,10 +1,10 @@
+#include "platform/framework/application.h"
 #include "platform/framework/frame.h"
 #include "platform/framework/guard.h"
 #include "platform/framework/scope.h"
 #include "platform/framework/turn.h"
 #include "platform/framework/window.h"
 #include "platform/framework/window_registry.h"
-
 
 namespace {
 
@@ -14,6 +14,13 @@ HWND nextFocus = nullptr; // while the focus is on its way there
 bool canTakeFocus(HWND handle) {
     const CWnd* const window = CWnd::FromHandle(handle);
     return window && window->IsWindowEnabled();
+}
+
+// The document's frame in front of the others; null when there is none.
+CFrameWnd* frameInFront() {
+    CWnd* const mainWindow = AfxGetMainWnd();
+    const bool holdsFrames = mainWindow && mainWindow->IsKindOf(RUNTIME_CLASS(CMDIFrameWnd));
+    return holdsFrames ? static_cast<CMDIFrameWnd*>(mainWindow)->MDIGetActive() : nullptr;
 }
 
 // Whether the holder lets the focus go. It may close windows and move the focus on the way.
@@ -66,8 +73,10 @@ HWND GetFocus() {
 }
 
 bool CWnd::MayTakeFocus() const {
+    if (!IsWindowVisible())
+        return false;
     const CWnd* const holder = FromHandle(theFocus ? theFocus : nextFocus);
-    CFrameWnd* const frame = holder ? holder->GetParentFrame() : nullptr;
+    CFrameWnd* const frame = holder ? holder->GetParentFrame() : frameInFront();
     return !frame || frame == GetParentFrame() || frame->IsChild(this);
 }
 

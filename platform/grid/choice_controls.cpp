@@ -72,6 +72,10 @@ bool FreeChoiceControl::TakeEntry(int index) {
     return entry && TakeText(CString(*entry));
 }
 
+int FreeChoiceControl::ChosenEntry() const {
+    return FindStringInChoiceList(GetCurrentText(), choiceListOf(*Grid(), Row(), Col()), TRUE);
+}
+
 bool CheckBoxControl::TakeText(const char* /*text*/) {
     return false;
 }

@@ -14,6 +14,7 @@ public:
     void Init(ROWCOL row, ROWCOL col) override;
     bool TakeText(const char* text) override;
     bool TakeEntry(int index) override;
+    int ChosenEntry() const override { return index_; }
     BOOL GetValue(CString& value) override;
     // The entry, or the value itself where it is no entry's number.
     CString GetDisplayText(const CString& value, const CGXStyle& style) override;
@@ -30,6 +31,7 @@ public:
 
     CellKind Kind() const override { return CellKind::FreeChoice; }
     bool TakeEntry(int index) override;
+    int ChosenEntry() const override;
 };
 
 // A box that is checked where the cell's value is a number other than 0.

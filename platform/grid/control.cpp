@@ -6,6 +6,10 @@
 CGXControl::CGXControl(CGXGridCore* grid, UINT itemId) : grid_(grid), itemId_(itemId) {}
 CGXControl::~CGXControl() = default;
 
+int CGXControl::ChosenEntry() const {
+    return -1;
+}
+
 kota::CellKind CGXControl::Kind() const {
     return kota::CellKind::Text;
 }

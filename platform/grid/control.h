@@ -39,6 +39,8 @@ public:
     // Takes the entry at a zero-based place of the cell's choice list. False when there is no such entry, and
     // in a control without a list.
     virtual bool TakeEntry(int index);
+    // The zero-based place of the entry that the text of the cell being edited is; -1 when it is none.
+    virtual int ChosenEntry() const;
 
     // Called when the cell is left with a changed text. 0: the text is refused, after SetWarningText of the
     // grid; the cell is not left.

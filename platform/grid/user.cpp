@@ -145,6 +145,17 @@ bool chooseEntry(CGXGridCore& grid, int index) {
     });
 }
 
+int chosenEntry(const CGXGridCore& grid) {
+    ROWCOL row = 0;
+    ROWCOL col = 0;
+    if (!grid.GetCurrentCell(&row, &col))
+        return -1;
+    CGXControl* const control = grid.GetControl(row, col);
+    if (!grid.IsEditing())
+        control->Init(row, col);
+    return control->ChosenEntry();
+}
+
 bool toggle(CGXGridCore& grid) {
     return performInFocus(grid, [](auto& data) { return data.toggle(); });
 }

@@ -25,6 +25,8 @@ KOTA_API bool selectCells(CGXGridCore& grid, const CGXRange& range);
 KOTA_API bool typeText(CGXGridCore& grid, const char* text);
 // Chooses the entry at a zero-based place of the current cell's choice list, which closes it.
 KOTA_API bool chooseEntry(CGXGridCore& grid, int index);
+// The zero-based place of the entry that the current cell shows; -1 when it is none.
+KOTA_API int chosenEntry(const CGXGridCore& grid);
 // Changes the current cell's check box, as the space bar does.
 KOTA_API bool toggle(CGXGridCore& grid);
 // The list of the current cell's entries was opened, which begins the edit if need be, or closed. A text that

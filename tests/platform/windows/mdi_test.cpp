@@ -126,7 +126,8 @@ TEST_F(Activation, TellsWhichWindowsMayTakeTheFocus) {
     EXPECT_FALSE(firstView->MayTakeFocus());
 
     SetFocus(nullptr);
-    EXPECT_TRUE(firstView->MayTakeFocus());
+    EXPECT_TRUE(secondView->MayTakeFocus());
+    EXPECT_FALSE(firstView->MayTakeFocus());
 }
 
 } // namespace
