@@ -5,6 +5,7 @@
 #include "platform/framework/property_sheet.h"
 #include "platform/framework/turn.h"
 #include "tests/support/editor.h"
+#include "tests/support/owned.h"
 
 #include <gmock/gmock.h>
 
@@ -92,6 +93,32 @@ TEST_F(NothingIsLost, OfANewerRecordWhenAWindowWasClosedWhileABoxStandsOpen) {
     }
 
     EXPECT_EQ(static_cast<AD_Decay*>(document.decayList.GetHead())->decayConst, 7.0);
+}
+
+TEST_F(NothingIsLost, OfANewerRecordWhenTheShellClosesAWindowWhileItsTabIsFirstShown) {
+    CKota0_adDoc& document = create();
+    kota::test::addLocal(document.dispersList, 0, "MISSOURI", 1000.0);
+    User newer(session);
+    newer.selectTab("Dispersion");
+    newer.newWindow();
+    User closed(session);
+    bool isClosed = false;
+    shell().onMessage = [&](const kota::headless::Received& received) {
+        if (received.code != 503 || isClosed)
+            return;
+        isClosed = true;
+        closed.view().GetParentFrame()->DestroyWindow();
+        newer.putCursor(1, 3);
+        newer.type("0.75");
+        newer.putCursor(1, 4);
+    };
+
+    closed.selectTab("Dispersion");
+    shell().onMessage = nullptr;
+
+    ASSERT_TRUE(isClosed);
+    ASSERT_EQ(document.dispersList.GetCount(), 1);
+    EXPECT_EQ(kota::test::recordOf(document.dispersList).dispFactor, 0.75);
 }
 
 TEST_F(NothingIsLost, WhenTheShellClosesTheWindowAndThenOffersALocation) {

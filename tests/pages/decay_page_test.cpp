@@ -123,9 +123,11 @@ TEST_F(TheDecayPage, StoresABlankChainageAsNotGivenAndShowsItBlankAgain) {
 
 TEST_F(TheDecayPage, StoresABlankConstantAsZeroWhenItIsLeft) {
     showLocalLine();
+    CGXGridCore& left = grid();
     put(1, 2, "");
     EXPECT_EQ(user->held(1, 2), "") << "not before";
     leaveTab();
+    EXPECT_EQ(left.GetValueRowCol(1, 2), "0");
     EXPECT_EQ(recordOf(document().decayList).decayConst, 0.0);
     ASSERT_TRUE(user->selectTab("Decay"));
     EXPECT_EQ(user->held(1, 2), "0.000000");

@@ -133,6 +133,7 @@ TEST_F(TheDispersionEdits, ShowTheNewValueInTheOtherWindows) {
 }
 
 TEST_F(TheDispersionEdits, HoldTheTabWhileTheMinimumIsAboveTheMaximum) {
+    ASSERT_TRUE(user->enterInto(Edit::Exponent, "1.5"));
     ASSERT_TRUE(user->enterInto(Edit::Minimum, "100.001"));
     put(1, 1, "NILE");
     put(1, 4, "");
@@ -141,7 +142,8 @@ TEST_F(TheDispersionEdits, HoldTheTabWhileTheMinimumIsAboveTheMaximum) {
     EXPECT_EQ(user->tab(), "Dispersion");
     EXPECT_THAT(boxes(), ElementsAre(boundsMessage));
     EXPECT_EQ(recordOf(document().dispersList).riverName, "NILE") << "the lines are stored all the same";
-    EXPECT_EQ(user->held(1, 4), "0") << "blanks have their values";
+    EXPECT_EQ(user->held(1, 4), "1.5") << "blanks have their values";
+    EXPECT_EQ(recordOf(document().dispersList).exponent, 1.5) << "and these are stored too";
 }
 
 TEST_F(TheDispersionEdits, LetTheTabGoWhenTheMinimumIsTheMaximum) {
