@@ -9,6 +9,7 @@ inline constexpr UINT ConcentrationUnits = 4756; // entries, one a line
 inline constexpr UINT ComponentKinds = 4758;     // entries, one a line
 inline constexpr UINT AcceleratorName = 4786;
 inline constexpr UINT DocTemplate = 4787; // seven parts, one a line
+inline constexpr UINT ApplicationTitle = 57344;
 inline constexpr UINT UndefinedChoice = 4829;
 inline constexpr UINT UndefinedEntry = 4832; // the first entry in front of the components'
 inline constexpr UINT HeadDispersionFactor = 4833;
@@ -51,6 +52,12 @@ inline constexpr UINT NotFound = 5010;
 inline constexpr UINT LastAlreadyFound = 5011;
 inline constexpr UINT LineNumberTooSmall = 5012;
 } // namespace StringId
+
+namespace MenuId {
+inline constexpr UINT Document = 4787;     // also the tool bar's, its bitmap's, and the document's icon
+inline constexpr UINT Accelerators = 4786; // also the editor's icon
+inline constexpr UINT EditorBitmap = 4793;
+} // namespace MenuId
 
 namespace DialogId {
 inline constexpr UINT Dispersion = 4771;
@@ -99,4 +106,5 @@ inline constexpr UINT InsertLine = 42561;
 inline constexpr UINT DeleteLine = 42562;
 inline constexpr UINT GotoLine = 42563;
 inline constexpr UINT InsertProbe = 42565;
+inline constexpr UINT DataUtility = 32773;
 } // namespace CommandId

@@ -65,6 +65,7 @@ constexpr kota::StringResource strings[] = {
     {StringId::EditorName, "AD Parameters"},
     {StringId::ToolbarName, " KOTA 31 AD Tools"},
     {StringId::SheetCaption, "Kota0 AD"},
+    {StringId::ApplicationTitle, "Kota0_AD"},
     {StringId::ProbeRiver, "SDFG"},
     {StringId::IntegerBetween, "Integer between %d and %d required"},
     {StringId::SearchPrompt, "Search for river name/topo ID.\nSearch"},

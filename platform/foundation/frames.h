@@ -1,6 +1,9 @@
 #pragma once
 
+#include "platform/foundation/toolbar.h"
 #include "platform/framework/frame.h"
+
+#include <vector>
 
 // The foundation's frame of a document.
 class KOTA_API CKhMDIChildWnd : public CMDIChildWnd {
@@ -8,4 +11,42 @@ class KOTA_API CKhMDIChildWnd : public CMDIChildWnd {
 public:
     CKhMDIChildWnd();
     ~CKhMDIChildWnd() override;
+};
+
+// A main window at whose sides bars can be docked.
+class KOTA_API SECMDIFrameWnd : public CMDIFrameWnd {
+    DECLARE_DYNAMIC(SECMDIFrameWnd)
+public:
+    SECMDIFrameWnd();
+    ~SECMDIFrameWnd() override;
+
+    // The sides of the frame that take bars, of CBRS_ALIGN_ANY. `flags` is 0.
+    void EnableDocking(UINT sides, UINT flags);
+    UINT DockingSides() const { return dockingSides_; }
+    // Docks a bar of the frame at one of `sides`, 0 for its first; without a rectangle the screen places it.
+    void DockControlBar(CControlBar* bar, UINT sides, const CRect* rect = nullptr);
+    // The bars docked so far that still have a window, in their order.
+    std::vector<CControlBar*> DockedBars() const;
+
+private:
+    UINT dockingSides_ = 0;
+    std::vector<HWND> docked_;
+};
+
+// The shell's main window. Its menu bar holds the menus of the shell, and the document in front adds its own
+// behind the second one: those that the shell has none of the same name for.
+class KOTA_API CKhMDIFrameWnd : public SECMDIFrameWnd {
+    DECLARE_DYNAMIC(CKhMDIFrameWnd)
+public:
+    CKhMDIFrameWnd();
+    ~CKhMDIFrameWnd() override;
+
+    // The shell's own menu, which must outlive the window.
+    void LoadMenu(const kota::MenuTemplate& own);
+
+protected:
+    void OnUpdateFrameMenu(const CDocTemplate* front) override;
+
+private:
+    const kota::MenuTemplate* own_ = nullptr;
 };

@@ -13,9 +13,13 @@ public:
     CCmdTarget();
     ~CCmdTarget() override;
 
-    // Runs the handler of a command or of a control's notification. 1: there was one. The base has none.
+    // Runs the handler of a command or of a control's notification; with CN_UPDATE_COMMAND_UI only tells
+    // whether a command has one. 1: there was one. The base has none.
     virtual BOOL OnCmdMsg(UINT id, int notification);
 };
+
+// In place of a notification: is there a handler of the command at present?
+inline constexpr int CN_UPDATE_COMMAND_UI = -1;
 
 namespace kota {
 
@@ -41,12 +45,14 @@ consteval std::array<CommandRow<Target>, rows> commandMap(const CommandRow<Targe
     return result;
 }
 
-// Runs the handler of the map; false when it has none.
+// Runs the handler of the map, unless it is only asked for; false when it has none.
 template <class Target, std::size_t rows>
 bool runCommand(Target& target, const std::array<CommandRow<Target>, rows>& map, UINT id, int notification) {
+    const bool asked = notification == CN_UPDATE_COMMAND_UI;
     for (const CommandRow<Target>& row : map)
-        if (row.id == id && row.notification == notification) {
-            (target.*row.handler)();
+        if (row.id == id && row.notification == (asked ? 0 : notification)) {
+            if (!asked)
+                (target.*row.handler)();
             return true;
         }
     return false;

@@ -130,6 +130,9 @@ BOOL CDialog::UpdateData(BOOL saveAndValidate) {
 void CDialog::DoDataExchange(CDataExchange* /*exchange*/) {}
 
 BOOL CDialog::OnCmdMsg(UINT id, int notification) {
+    const bool isOwn = modal_ && (id == IDOK || id == IDCANCEL);
+    if (isOwn && notification == CN_UPDATE_COMMAND_UI)
+        return TRUE;
     if (modal_ && notification == BN_CLICKED && id == IDOK)
         OnOK();
     else if (modal_ && notification == BN_CLICKED && id == IDCANCEL)

@@ -7,6 +7,7 @@
 #include "platform/framework/view.h"
 
 #include <algorithm>
+#include <string>
 #include <utility>
 
 IMPLEMENT_DYNAMIC(CDocument, CCmdTarget, kota::platformModule)
@@ -22,9 +23,19 @@ CDocument::~CDocument() {
 
 void CDocument::SetTitle(const char* title) {
     title_ = title;
+    UpdateFrameTitles();
+}
+
+void CDocument::UpdateFrameTitles() {
+    std::vector<CFrameWnd*> frames;
     for (const CView* view : views_)
-        if (CFrameWnd* const frame = view->GetParentFrame())
-            frame->SetWindowText(title);
+        if (CFrameWnd* const frame = view->GetParentFrame();
+            frame && std::ranges::find(frames, frame) == frames.end())
+            frames.push_back(frame);
+    for (std::size_t i = 0; i < frames.size(); ++i) {
+        frames[i]->SetWindowText(frames.size() == 1 ? title_ : title_ + ":" + std::to_string(i + 1).c_str());
+        frames[i]->SetModifiedMark(modified_);
+    }
 }
 
 void CDocument::SetPathName(const char* path) {
@@ -37,7 +48,8 @@ BOOL CDocument::IsModified() {
     return modified_;
 }
 void CDocument::SetModifiedFlag(BOOL modified) {
-    modified_ = modified != 0;
+    if (std::exchange(modified_, modified != 0) != modified_)
+        UpdateFrameTitles();
 }
 
 void CDocument::AddView(CView* view) {
@@ -53,6 +65,8 @@ void CDocument::RemoveView(CView* view) {
     view->document_ = nullptr;
     if (views_.empty() && docTemplate_)
         OnCloseDocument();
+    else
+        UpdateFrameTitles();
 }
 
 void CDocument::OnCloseDocument() {

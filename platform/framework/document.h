@@ -56,6 +56,8 @@ public:
     // Whether a frame of the document may be closed: not when it is the last one and the user, asked about
     // changes, wants to stay.
     virtual BOOL CanCloseFrame(CFrameWnd* frame);
+    // Gives the frames of the document its title, numbered where there are several, and the mark of changes.
+    void UpdateFrameTitles();
     // Has the control with the focus, if it is in a view of the document, take over what the user typed. 0
     // when it refuses.
     BOOL TakePendingInput();

@@ -4,6 +4,8 @@
 #include "platform/framework/template.h"
 #include "platform/framework/turn.h"
 
+#include <utility>
+
 IMPLEMENT_DYNAMIC(CFrameWnd, CWnd, kota::platformModule)
 
 CFrameWnd::CFrameWnd() = default;
@@ -43,12 +45,18 @@ BOOL CFrameWnd::OnCreateClient(CREATESTRUCT* /*create*/, const CCreateContext& c
 
 void CFrameWnd::InitialUpdateFrame(CDocument* document, BOOL makeVisible) {
     if (document)
-        SetWindowText(document->GetTitle());
+        document->UpdateFrameTitles();
     if (CView* const view = GetActiveView())
         view->OnInitialUpdate();
     ShowWindow(makeVisible);
     if (makeVisible)
         ActivateFrame();
+}
+
+void CFrameWnd::SetModifiedMark(bool modified) {
+    kota::WindowState* const state = MutableState();
+    if (state && std::exchange(state->modified, modified) != modified)
+        kota::noteChange(GetSafeHwnd(), kota::Change::Text);
 }
 
 void CFrameWnd::RecalcLayout() {

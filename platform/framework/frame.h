@@ -1,7 +1,12 @@
 #pragma once
 
 #include "platform/framework/menu.h"
+#include "platform/framework/resources.h"
 #include "platform/framework/view.h"
+
+#include <vector>
+
+class CDocTemplate;
 
 // How a frame's window is to be made.
 struct CREATESTRUCT {
@@ -18,11 +23,13 @@ public:
 
     // Makes the frame's window inside `parent`, and the view of `context` in it. 0 when that failed; then
     // the frame has no window.
-    BOOL LoadFrame(CWnd* parent, const CCreateContext& context);
+    virtual BOOL LoadFrame(CWnd* parent, const CCreateContext& context);
     virtual BOOL PreCreateWindow(CREATESTRUCT& create);
     virtual BOOL OnCreateClient(CREATESTRUCT* create, const CCreateContext& context);
     // Calls OnInitialUpdate of the view, and brings the frame to the front if it is to be seen.
     void InitialUpdateFrame(CDocument* document, BOOL makeVisible);
+    // Shows whether the document has changes that are not saved.
+    void SetModifiedMark(bool modified);
     virtual void RecalcLayout();
     virtual void ActivateFrame();
     // Asks about changes if this is the document's last frame, and destroys the frame unless the user keeps
@@ -53,8 +60,13 @@ public:
     CMDIChildWnd();
     ~CMDIChildWnd() override;
 
+    BOOL LoadFrame(CWnd* parent, const CCreateContext& context) override;
     void ActivateFrame() override;
     BOOL DestroyWindow() override;
+
+private:
+    friend class CMDIFrameWnd;
+    std::vector<bool> topEntries_; // of the menu, while another one is shown: which are enabled
 };
 
 // A main window that holds the documents' frames.
@@ -77,9 +89,26 @@ public:
     // A command goes to the frame in front first. "New Window" is the main window's own.
     BOOL OnCmdMsg(UINT id, int notification) override;
 
+    // Shows the menu that goes with a frame, with its top entries enabled as they were when it was shown
+    // last; null when no frame is left.
+    void ShowMenuOf(CMDIChildWnd* child);
+    // The command that a key runs for the frame in front or for the main window; 0 for none.
+    UINT CommandOf(const kota::Accelerator& pressed) const;
+    // The prompt of a command and, behind a line feed, its tool tip: the front document's, or else this
+    // window's.
+    CString GetMessageString(UINT id) const;
+    // The main window's own keys, which must outlive it.
+    void LoadAccelerators(const kota::AcceleratorTable& own) { ownKeys_ = &own; }
+
+protected:
+    // Builds the menu for the documents of a template, null for no document. The base leaves it as it is.
+    virtual void OnUpdateFrameMenu(const CDocTemplate* front);
+
 private:
     void OnWindowNew();
 
     CMenu menu_;
+    HWND menuOf_ = nullptr;
     HWND activeChild_ = nullptr;
+    const kota::AcceleratorTable* ownKeys_ = nullptr;
 };

@@ -72,6 +72,13 @@ bool translated(MSG& message) {
     return false;
 }
 
+// Runs the command of a key. A key whose command is greyed or has no handler goes on to the window.
+bool accelerated(const Accelerator& pressed) {
+    auto* const mainFrame = dynamic_cast<CMDIFrameWnd*>(AfxGetMainWnd());
+    const UINT id = mainFrame ? mainFrame->CommandOf(pressed) : 0;
+    return id != 0 && command(id);
+}
+
 void tellParent(const CWnd& control, int notification) {
     for (CWnd* around = control.GetParent(); around; around = around->GetParent()) {
         const WindowKind kind = around->State()->setup.kind;
@@ -117,7 +124,9 @@ bool key(WPARAM key, Modifiers modifiers) {
     const HeldScope scope(modifiers); // what the turn posts is delivered while they are held
     return perform([&] {
         MSG message{.hwnd = ::GetFocus(), .message = WM_KEYDOWN, .wParam = key, .lParam = 0};
-        if (translated(message))
+        if (translated(message) ||
+            accelerated(
+                {.key = key, .control = modifiers.control, .shift = modifiers.shift, .alt = modifiers.alt}))
             return true;
         if (key == VK_F1)
             return ::SendMessage(message.hwnd, WM_HELP, 0, 0) != 0;
@@ -195,6 +204,24 @@ bool command(UINT id) {
         if (menu && isGreyed(*menu, id))
             return false;
         return mainWindow && mainWindow->SendMessage(WM_COMMAND, commandParam(id, 0)) != 0;
+    });
+}
+
+bool canCommand(UINT id) {
+    CWnd* const mainWindow = AfxGetMainWnd();
+    const CMenu* const menu = mainWindow ? mainWindow->GetMenu() : nullptr;
+    return mainWindow && !(menu && isGreyed(*menu, id)) && mainWindow->OnCmdMsg(id, CN_UPDATE_COMMAND_UI);
+}
+
+bool activate(CMDIChildWnd& frame) {
+    return perform([&] {
+        const HWND handle = frame.GetSafeHwnd();
+        CWnd* const holder = CWnd::GetFocus();
+        const bool leaves = holder && holder != &frame && !frame.IsChild(holder);
+        if (!takesInput(frame) || (leaves && !holder->LetFocusGo()) || !IsWindow(handle))
+            return false;
+        frame.ActivateFrame();
+        return true;
     });
 }
 

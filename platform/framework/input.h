@@ -2,6 +2,7 @@
 
 #include "platform/framework/window.h"
 
+class CMDIChildWnd;
 class CPropertySheet;
 
 // What a user does with windows. A screen calls these for mouse and keyboard, a test by itself: both go the
@@ -15,8 +16,9 @@ struct Modifiers {
     bool alt = false;
 };
 
-// A key goes down: PreTranslateMessage of the window with the focus and of those around it, and then, if
-// none took it, its own WM_KEYDOWN; F1 asks it for help. True when somebody took the key.
+// A key goes down: PreTranslateMessage of the window with the focus and of those around it, then the main
+// window's accelerators, and then, if none took it, its own WM_KEYDOWN; F1 asks it for help. True when
+// somebody took the key.
 KOTA_API bool key(WPARAM key, Modifiers modifiers = {});
 // A window is clicked or tabbed to. False when it, or the one that has the focus, refuses.
 KOTA_API bool focus(CWnd& window);
@@ -30,6 +32,10 @@ KOTA_API bool choose(CWnd& comboBox, int entry);
 KOTA_API bool selectTab(CPropertySheet& sheet, int index);
 // A command of the main window's menu. False when it is greyed or nobody has a handler.
 KOTA_API bool command(UINT id);
+// Whether it would be carried out.
+KOTA_API bool canCommand(UINT id);
+// A document's frame is brought to the front. False when what has the focus refuses to let it go.
+KOTA_API bool activate(CMDIChildWnd& frame);
 // The close button of a frame or a dialog.
 KOTA_API bool close(CWnd& window);
 

@@ -3,6 +3,8 @@
 #include "platform/framework/template.h"
 #include "platform/framework/turn.h"
 
+#include <algorithm>
+
 IMPLEMENT_DYNCREATE(CMDIChildWnd, CFrameWnd, kota::platformModule)
 IMPLEMENT_DYNAMIC(CMDIFrameWnd, CFrameWnd, kota::platformModule)
 
@@ -12,6 +14,11 @@ CMDIFrameWnd* mainFrameOf(const CWnd& child) {
     CWnd* const parent = child.GetParent();
     return parent && parent->IsKindOf(RUNTIME_CLASS(CMDIFrameWnd)) ? static_cast<CMDIFrameWnd*>(parent)
                                                                    : nullptr;
+}
+
+const CDocTemplate* templateOf(const CMDIChildWnd* child) {
+    const CDocument* const document = child ? child->GetActiveDocument() : nullptr;
+    return document ? document->GetDocTemplate() : nullptr;
 }
 
 } // namespace
@@ -26,6 +33,13 @@ void CMDIChildWnd::ActivateFrame() {
         CFrameWnd::ActivateFrame();
 }
 
+BOOL CMDIChildWnd::LoadFrame(CWnd* parent, const CCreateContext& context) {
+    const BOOL loaded = CFrameWnd::LoadFrame(parent, context);
+    if (CMDIFrameWnd* const mainFrame = mainFrameOf(*this); loaded && mainFrame)
+        mainFrame->ShowMenuOf(this); // the view may enable and grey entries before it is in front
+    return loaded;
+}
+
 BOOL CMDIChildWnd::DestroyWindow() {
     CMDIFrameWnd* const mainFrame = mainFrameOf(*this);
     const bool wasActive = mainFrame && mainFrame->MDIGetActive() == this;
@@ -34,6 +48,8 @@ BOOL CMDIChildWnd::DestroyWindow() {
     const BOOL destroyed = CFrameWnd::DestroyWindow();
     if (wasActive && !mainFrame->Children().empty())
         mainFrame->MDIActivate(mainFrame->Children().back());
+    if (mainFrame)
+        mainFrame->ShowMenuOf(mainFrame->MDIGetActive());
     return destroyed;
 }
 
@@ -57,9 +73,50 @@ void CMDIFrameWnd::MDIActivate(CMDIChildWnd* child) {
     CView* const view = isEntered ? child->GetActiveView() : nullptr;
     if (!view)
         return;
+    ShowMenuOf(child);
     child->BringWindowToTop();
     view->OnActivateView(TRUE, view, view);
     view->SetFocus();
+}
+
+void CMDIFrameWnd::ShowMenuOf(CMDIChildWnd* child) {
+    const HWND shown = child ? child->GetSafeHwnd() : nullptr;
+    if (shown == menuOf_)
+        return;
+    if (auto* const before = static_cast<CMDIChildWnd*>(FromHandle(menuOf_))) {
+        before->topEntries_.clear();
+        for (const CMenu::Entry& entry : menu_.Entries())
+            before->topEntries_.push_back(entry.enabled);
+    }
+    menuOf_ = shown;
+    OnUpdateFrameMenu(templateOf(child));
+    for (std::size_t i = 0; child && i < child->topEntries_.size(); ++i)
+        menu_.EnableMenuItem(static_cast<UINT>(i),
+                             MF_BYPOSITION | (child->topEntries_[i] ? MF_ENABLED : MF_GRAYED));
+    DrawMenuBar();
+}
+
+void CMDIFrameWnd::OnUpdateFrameMenu(const CDocTemplate* /*front*/) {}
+
+UINT CMDIFrameWnd::CommandOf(const kota::Accelerator& pressed) const {
+    const auto commandIn = [&](const kota::AcceleratorTable& table) -> UINT {
+        const auto found = std::ranges::find_if(table.keys, [&](const kota::Accelerator& entry) {
+            return entry.key == pressed.key && entry.control == pressed.control &&
+                   entry.shift == pressed.shift && entry.alt == pressed.alt;
+        });
+        return found == table.keys.end() ? 0 : found->command;
+    };
+    if (const CDocTemplate* const docTemplate = templateOf(MDIGetActive()))
+        for (const kota::AcceleratorTable& table : docTemplate->Module().accelerators())
+            if (const UINT command = commandIn(table))
+                return command;
+    return ownKeys_ ? commandIn(*ownKeys_) : 0;
+}
+
+CString CMDIFrameWnd::GetMessageString(UINT id) const {
+    const CDocTemplate* const docTemplate = templateOf(MDIGetActive());
+    const CString documents = docTemplate ? docTemplate->Module().string(id) : CString();
+    return documents.IsEmpty() ? GetRuntimeClass()->Module().string(id) : documents;
 }
 
 std::vector<CMDIChildWnd*> CMDIFrameWnd::Children() const {

@@ -22,16 +22,25 @@ public:
         std::unique_ptr<CMenu> submenu;
     };
 
+    struct Command {
+        UINT id;
+        CString text;
+    };
+
     CMenu();
     ~CMenu();
     CMenu(const CMenu&) = delete;
     CMenu& operator=(const CMenu&) = delete;
 
-    void AppendMenu(UINT id, const char* text);
+    // Takes all entries out.
+    void Clear();
+    void AppendMenu(UINT id, const char* text, UINT flags = MF_ENABLED);
     void AppendSeparator();
     // The menu behind the new entry, owned by this one.
     CMenu& AppendPopup(const char* text);
 
+    // Puts commands in the place of those from `first` to before `end` that stand together, at any depth.
+    void ReplaceCommands(UINT first, UINT end, const std::vector<Command>& commands);
     // Enables an entry or greys it: that at a zero-based place of this menu (MF_BYPOSITION), or that of a
     // command, at any depth. Gives the state before (MF_ENABLED or MF_GRAYED), -1 when there is no such
     // entry.

@@ -48,16 +48,35 @@ inline constexpr WPARAM VK_F1 = 112;
 inline constexpr WPARAM VK_F2 = 113;
 inline constexpr WPARAM VK_F3 = 114;
 inline constexpr WPARAM VK_F4 = 115;
+inline constexpr WPARAM VK_F6 = 117;
 inline constexpr WPARAM VK_F7 = 118;
 
+inline constexpr UINT ID_FILE_NEW = 57600;
+inline constexpr UINT ID_FILE_OPEN = 57601;
 inline constexpr UINT ID_FILE_CLOSE = 57602;
 inline constexpr UINT ID_FILE_SAVE = 57603;
 inline constexpr UINT ID_FILE_SAVE_AS = 57604;
+inline constexpr UINT ID_FILE_PRINT_SETUP = 57606;
 inline constexpr UINT ID_FILE_PRINT = 57607;
 inline constexpr UINT ID_FILE_PRINT_DIRECT = 57608;
 inline constexpr UINT ID_FILE_PRINT_PREVIEW = 57609;
+inline constexpr UINT ID_FILE_MRU_FILE1 = 57616; // and those behind it: the files used last
+inline constexpr UINT ID_EDIT_COPY = 57634;
+inline constexpr UINT ID_EDIT_CUT = 57635;
+inline constexpr UINT ID_EDIT_PASTE = 57637;
+inline constexpr UINT ID_EDIT_UNDO = 57643;
 inline constexpr UINT ID_WINDOW_NEW = 57648;
+inline constexpr UINT ID_WINDOW_ARRANGE = 57649;
+inline constexpr UINT ID_WINDOW_CASCADE = 57650;
+inline constexpr UINT ID_WINDOW_TILE_HORZ = 57651;
+inline constexpr UINT ID_APP_ABOUT = 57664;
+inline constexpr UINT ID_APP_EXIT = 57665;
+inline constexpr UINT ID_HELP_INDEX = 57667;
 inline constexpr UINT ID_HELP = 57670;
+inline constexpr UINT ID_NEXT_PANE = 57680;
+inline constexpr UINT ID_PREV_PANE = 57681;
+inline constexpr UINT ID_VIEW_TOOLBAR = 59392;
+inline constexpr UINT ID_VIEW_STATUS_BAR = 59393;
 
 // wParam of WM_COMMAND. A menu's or an accelerator's command has the notification 0.
 constexpr WPARAM commandParam(UINT id, int notification) {

@@ -1,45 +1,42 @@
 #pragma once
 
-#include "platform/framework/dialog_template.h"
 #include "platform/framework/export.h"
+#include "platform/framework/extension.h"
+#include "platform/framework/resources.h"
 #include "platform/framework/text.h"
-#include "platform/framework/types.h"
-
-#include <span>
 
 namespace kota {
 
-// One row of a string table.
-struct StringResource {
-    UINT id;
-    const char* text;
-};
-
-// What a module brings along, as tables that must outlive it.
-struct Resources {
-    std::span<const StringResource> strings = {};
-    std::span<const DialogTemplate> dialogs = {};
-};
-
 // The identity of a library and the way to its resources. Each library has one module, a constant of its
 // own; run-time classes carry its address, and a resource id is looked up in the module that it came from,
-// so that two libraries with the same ids or class names do not meet.
+// so that two libraries with the same ids or class names do not meet. What the language library of the
+// module's record holds goes before the module's own tables.
 class KOTA_API Module {
 public:
-    // `name` must outlive the module.
-    Module(const char* name, const Resources& resources);
+    // `name`, the tables of `resources` and `record` must outlive the module.
+    Module(const char* name, const Resources& resources, const AFX_EXTENSION_MODULE* record = nullptr);
     Module(const Module&) = delete;
     Module& operator=(const Module&) = delete;
 
     const char* name() const;
     // The text of a string id, empty when the module has none.
     CString string(UINT id) const;
-    // The dialog of a number, null when the module has none.
+    // The resource of a number; null when the module has none.
     const DialogTemplate* dialog(UINT id) const;
+    const MenuTemplate* menu(UINT id) const;
+    const ToolBarTemplate* toolBar(UINT id) const;
+    const BitmapResource* bitmap(UINT id) const;
+    const BitmapResource* icon(UINT id) const;
+    // All tables of keys that the module has.
+    std::span<const AcceleratorTable> accelerators() const { return resources_.accelerators; }
 
 private:
+    template <class Resource>
+    const Resource* find(std::span<const Resource> Resources::*table, UINT id) const;
+
     const char* name_;
     Resources resources_;
+    const AFX_EXTENSION_MODULE* record_;
 };
 
 // The platform's own module.

@@ -44,6 +44,7 @@ enum class WindowKind {
     Sheet,
     View,
     Frame,
+    ToolBar,
 };
 
 // What a window is made with.
@@ -67,6 +68,7 @@ struct WindowState {
     bool enabled = true; // by itself: it takes input only while all windows around it do
     bool visible = true;
     bool startsGroup = false;     // of radio buttons: the first of those that belong together
+    bool modified = false;        // of frames: its document has changes that are not saved
     bool checked = false;         // of check boxes and radio buttons
     int textLimit = 0;            // of edits: characters that a user may type, 0 for any number
     std::vector<CString> choices; // of combo boxes

@@ -22,6 +22,15 @@ Location locationOf(const CK31_CBE_ModelDataItem& item) {
     return {std::string(item.riverName.View()), item.chainage, item.chainage2, item.dataType};
 }
 
+constexpr MenuItemTemplate fileItems[] = {{ID_FILE_CLOSE, "&Close"},
+                                          {ID_FILE_SAVE, "&Save\tCtrl+S"},
+                                          {ID_FILE_SAVE_AS, "Save &As..."},
+                                          {ID_FILE_PRINT, "&Print...\tCtrl+P"}};
+constexpr MenuItemTemplate windowItems[] = {{ID_WINDOW_NEW, "&New Window"}};
+constexpr MenuPopupTemplate popups[] = {
+    {"&File", fileItems}, {"&Edit", {}}, {"&View", {}}, {"&Window", windowItems}, {"&Help", {}}};
+constexpr MenuTemplate menu{.id = 0, .popups = popups};
+
 LRESULT handOver(CObject* object) {
     return reinterpret_cast<LRESULT>(object);
 }
@@ -29,8 +38,7 @@ LRESULT handOver(CObject* object) {
 } // namespace
 
 MainWindow::MainWindow() {
-    for (const char* name : {"&File", "&Edit", "&Grid", "&View", "&Window", "&Help"})
-        GetMenu()->AppendPopup(name);
+    LoadMenu(menu);
 }
 MainWindow::~MainWindow() = default;
 
@@ -91,7 +99,7 @@ LRESULT MainWindow::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     }
     const bool toSwitchBoard = message == switchBoardMessage();
     if (!toSwitchBoard && message != communicationMessage())
-        return CMDIFrameWnd::WindowProc(message, wParam, lParam);
+        return CKhMDIFrameWnd::WindowProc(message, wParam, lParam);
     record(message, wParam, reinterpret_cast<const CKHComm_Package*>(lParam));
     return toSwitchBoard ? answer(wParam) : 0;
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "exchange/packages/packages.h"
-#include "platform/framework/frame.h"
+#include "platform/foundation/frames.h"
 #include "platform/headless/project.h"
 
 #include <functional>
@@ -25,7 +25,7 @@ struct Received {
 
 // The main window of a shell: answers the editors' requests from a project given to it, and records what
 // they send.
-class MainWindow : public CMDIFrameWnd {
+class MainWindow : public CKhMDIFrameWnd {
 public:
     MainWindow();
     ~MainWindow() override;

@@ -1,9 +1,9 @@
 #include "platform/headless/session.h"
 
+#include "platform/foundation/plug_in.h"
 #include "platform/framework/document.h"
 #include "platform/framework/template.h"
 #include "platform/framework/turn.h"
-#include "platform/headless/plug_in.h"
 
 #include <cstdio>
 #include <cstdlib>
@@ -23,9 +23,14 @@ Session::~Session() {
         fail_("the script has answers that nothing asked for");
 }
 
-void Session::load(const std::string& plugIn) {
-    for (auto& docTemplate : PlugIn(plugIn).makeTemplates())
+void Session::load(const std::string& path) {
+    const PlugIn plugIn(path);
+    for (auto& docTemplate : plugIn.makeTemplates())
         application_.AddDocTemplate(std::move(docTemplate));
+    for (int index = 0; index < plugIn.toolBarCount(); ++index)
+        if (auto toolBar =
+                plugIn.makeToolBar(mainWindow_, 0, firstToolBar + static_cast<UINT>(toolBars_.size()), index))
+            toolBars_.push_back(std::move(toolBar));
 }
 
 CDocument* Session::open(const std::string& path) {

@@ -33,8 +33,9 @@ public:
     ScriptedScreen& screen() { return screen_; }
     Application& application() { return application_; }
 
-    // Makes the templates of a plug-in known; see PlugIn.
-    void load(const std::string& plugIn);
+    // Makes the templates and the tool bars of a plug-in known; see PlugIn.
+    void load(const std::string& path);
+    const std::vector<std::unique_ptr<CKhToolBarEx>>& toolBars() const { return toolBars_; }
     // Null when that failed; the user was told why in a box.
     CDocument* open(const std::string& path);
     // A new document of the first template.
@@ -47,11 +48,14 @@ public:
     void closeMainWindow();
 
 private:
+    static constexpr UINT firstToolBar = 59400; // the number of the first one's window
+
     [[noreturn]] static void abortWith(const std::string& text);
 
     std::function<void(const std::string&)> fail_;
     Application application_;
     MainWindow mainWindow_;
+    std::vector<std::unique_ptr<CKhToolBarEx>> toolBars_;
     ScriptedScreen screen_;
     Screen* screenBefore_;
 };

@@ -238,12 +238,28 @@ TEST_F(NewWindow, IsASecondViewOfTheSameDocumentInFront) {
     EXPECT_EQ(docTemplate.Documents().size(), 1U);
     EXPECT_NE(&frameOf(document, 0), &frameOf(document, 1));
     EXPECT_EQ(session.mainWindow().MDIGetActive(), &frameOf(document, 1));
-    EXPECT_EQ(frameOf(document, 1).GetWindowText(), "platte.tst");
+    EXPECT_EQ(frameOf(document, 0).GetWindowText(), "platte.tst:1");
+    EXPECT_EQ(frameOf(document, 1).GetWindowText(), "platte.tst:2");
     EXPECT_EQ(TestView::initialUpdates, 2);
 
     document.SetPathName("/rivers/missouri.tst");
+    EXPECT_EQ(frameOf(document, 0).GetWindowText(), "missouri.tst:1");
+    EXPECT_EQ(frameOf(document, 1).GetWindowText(), "missouri.tst:2");
+
+    kota::input::close(frameOf(document, 0));
     EXPECT_EQ(frameOf(document, 0).GetWindowText(), "missouri.tst");
-    EXPECT_EQ(frameOf(document, 1).GetWindowText(), "missouri.tst");
+}
+
+TEST_F(NewWindow, ShowsTheMarkOfChangesAsTheFirstOneDoes) {
+    CDocument& document = *openWith(docTemplate, "/rivers/platte.tst");
+    document.SetModifiedFlag();
+    kota::input::command(ID_WINDOW_NEW);
+    EXPECT_TRUE(frameOf(document, 0).State()->modified);
+    EXPECT_TRUE(frameOf(document, 1).State()->modified);
+
+    document.SetModifiedFlag(FALSE);
+    EXPECT_FALSE(frameOf(document, 0).State()->modified);
+    EXPECT_FALSE(frameOf(document, 1).State()->modified);
 }
 
 TEST_F(NewWindow, IsNoneWithoutADocument) {
