@@ -35,6 +35,15 @@ constexpr std::array<std::pair<int, WPARAM>, 17> keys = {{
     {Qt::Key_Space, ' '},
 }};
 
+// A letter typed with Ctrl or Alt, which is a command where there is one.
+std::optional<WPARAM> heldLetter(const QKeyEvent& key) {
+    const bool isLetter = key.key() >= Qt::Key_A && key.key() <= Qt::Key_Z;
+    const bool isHeld =
+        key.modifiers().testFlag(Qt::ControlModifier) != key.modifiers().testFlag(Qt::AltModifier);
+    return isLetter && isHeld ? std::optional<WPARAM>('A' + static_cast<WPARAM>(key.key() - Qt::Key_A))
+                              : std::nullopt;
+}
+
 } // namespace
 
 std::optional<WPARAM> virtualKey(int qtKey) {
@@ -102,6 +111,8 @@ void Keyboard::deliver(QEvent& event) {
         return;
     }
     auto& key = static_cast<QKeyEvent&>(event);
+    if (const auto letter = heldLetter(key); letter && input::key(*letter, modifiersOf(key)))
+        return;
     if (part && part->takeKey(key))
         return;
     if (const auto number = virtualKey(key.key()))

@@ -33,9 +33,11 @@ void Part::update() {
                 own->setVisible(state.visible);
             own->setToolTip(toQt(state.toolTip));
         }
+    widget_->setAccessibleName(toQt(state.label.IsEmpty() ? state.text : state.label).remove('&'));
     refresh(state);
 }
 
+void Part::settle() {}
 void Part::add(Part& /*child*/) {}
 
 bool Part::takeKey(QKeyEvent& /*key*/) {

@@ -29,6 +29,8 @@ public:
     void retire();
     // Shows the window as it stands.
     void update();
+    // An input is done, with all that it changed.
+    virtual void settle();
 
     // Takes the part of a window inside this one into the layout, behind those that are there.
     virtual void add(Part& child);

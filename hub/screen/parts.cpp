@@ -4,6 +4,7 @@
 #include "hub/screen/controls.h"
 #include "hub/screen/edit_part.h"
 #include "hub/screen/grid_part.h"
+#include "hub/screen/main_part.h"
 
 #include <memory>
 #include <vector>
@@ -42,8 +43,13 @@ std::unique_ptr<Part> makePart(Parts& parts, const CWnd& window) {
     case WindowKind::Page:
     case WindowKind::Dialog:
     case WindowKind::View:
-    case WindowKind::Frame:
         return std::make_unique<FormPart>(parts, handle);
+    case WindowKind::Frame:
+        if (window.IsKindOf(RUNTIME_CLASS(CMDIFrameWnd)))
+            return std::make_unique<MainPart>(parts, handle);
+        return std::make_unique<FramePart>(parts, handle);
+    case WindowKind::ToolBar:
+        return std::make_unique<ToolBarPart>(parts, handle);
     }
     return nullptr;
 }
@@ -97,6 +103,9 @@ void Parts::change(const WindowChange& change) {
 }
 
 void Parts::settle() {
+    const std::map<HWND, Part*> present = parts_;
+    for (const auto& [window, shown] : present)
+        shown->settle();
     const Part* const part = find(::GetFocus());
     QWidget* const target = part ? part->focusTarget() : nullptr;
     if (target && !target->hasFocus())

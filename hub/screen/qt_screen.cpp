@@ -36,6 +36,19 @@ QWidget* QtScreen::makeWindow(const CWnd& window) {
     return made;
 }
 
+QMainWindow* QtScreen::makeMainWindow(const CMDIFrameWnd& frame) {
+    Part* const part = parts_.make(frame.GetSafeHwnd());
+    parts_.settle();
+    return part ? static_cast<QMainWindow*>(part->widget()) : nullptr;
+}
+
+void QtScreen::perform(std::function<void()> action) {
+    queue_.add([act = std::move(action)] {
+        const Turn turn;
+        act();
+    });
+}
+
 QWidget* QtScreen::widgetOf(const CWnd& window) const {
     const Part* const part = parts_.find(window.GetSafeHwnd());
     return part ? part->widget() : nullptr;
@@ -67,6 +80,11 @@ int QtScreen::showMessageBox(const MessageBoxRequest& request) {
     default:
         return asks ? IDCANCEL : IDOK;
     }
+}
+
+QStringList QtScreen::askOpenNames(const QString& filters) {
+    const InputQueue::Level level(queue_);
+    return QFileDialog::getOpenFileNames(QApplication::activeWindow(), QString(), QString(), filters);
 }
 
 std::optional<CString> QtScreen::askSaveName(const CString& proposal) {

@@ -1,8 +1,10 @@
 #pragma once
 
 #include "hub/screen/parts.h"
+#include "platform/framework/frame.h"
 #include "platform/framework/screen.h"
 
+#include <QMainWindow>
 #include <QTimer>
 
 #include <functional>
@@ -19,9 +21,15 @@ public:
     // Makes a window of the desktop for a window of the platform, not yet shown. It deletes itself when that
     // one is gone, or else with the screen.
     QWidget* makeWindow(const CWnd& window);
+    // Makes the main window, not yet shown, with what is in it. It lives as long as the platform's.
+    QMainWindow* makeMainWindow(const CMDIFrameWnd& frame);
+    // Does something outside an input, as a turn of its own, when the event loop comes to it.
+    void perform(std::function<void()> action);
     // The widget of a window; null when it is not on the screen.
     QWidget* widgetOf(const CWnd& window) const;
 
+    // Asks for files to open; `filters` is in the toolkit's form. Empty when the user changed their mind.
+    QStringList askOpenNames(const QString& filters);
     int showMessageBox(const MessageBoxRequest& request) override;
     std::optional<CString> askSaveName(const CString& proposal) override;
     void showDialog(CDialog& dialog) override;

@@ -1,0 +1,177 @@
+#include "hub/shell/hub_frame.h"
+
+#include "exchange/packages/packages.h"
+#include "hub/screen/text.h"
+#include "hub/shell/menu.h"
+#include "platform/framework/document.h"
+#include "platform/framework/message_box.h"
+#include "platform/framework/messages.h"
+#include "platform/framework/template.h"
+
+#include <QApplication>
+#include <QFileInfo>
+
+namespace kota::hub {
+
+IMPLEMENT_DYNAMIC(HubFrame, CKhMDIFrameWnd, hubModule)
+
+namespace {
+
+constexpr UINT firstToolBarId = 59400;
+
+// Shows that the program is busy before it stops answering.
+class Busy {
+public:
+    explicit Busy() {
+        QGuiApplication::setOverrideCursor(Qt::WaitCursor);
+        for (QWidget* const window : QApplication::topLevelWidgets())
+            if (window->isVisible())
+                window->repaint();
+    }
+    ~Busy() { QGuiApplication::restoreOverrideCursor(); }
+    Busy(const Busy&) = delete;
+    Busy& operator=(const Busy&) = delete;
+};
+
+void tell(const QString& text) {
+    AfxMessageBox(toPlatform(text).constData());
+}
+
+} // namespace
+
+HubFrame::HubFrame(CWinApp& application, QtScreen& screen) : application_(application), screen_(screen) {
+    Create({.parent = nullptr, .kind = WindowKind::Frame});
+    SetWindowText("KOTAHub");
+    LoadMenu(hubMenu());
+    LoadAccelerators(hubKeys());
+    application_.SetMainWnd(this);
+}
+
+HubFrame::~HubFrame() = default;
+
+void HubFrame::load(PlugIns plugIns) {
+    plugIns_ = std::move(plugIns.loaded);
+    for (const PlugIn& plugIn : plugIns_) {
+        for (auto& docTemplate : plugIn.makeTemplates())
+            application_.AddDocTemplate(std::move(docTemplate));
+        for (int index = 0; index < plugIn.toolBarCount(); ++index) {
+            const UINT id = firstToolBarId + static_cast<UINT>(toolBars_.size());
+            auto toolBar = plugIn.makeToolBar(*this, 0, id, index);
+            if (!toolBar)
+                continue;
+            toolBar->SetWindowText(plugIn.toolBarName(index));
+            toolBar->ShowWindow(FALSE); // until a document of the editor is in front
+            toolBars_.push_back(std::move(toolBar));
+        }
+    }
+    if (!plugIns.problems.empty())
+        tell(plugIns.problems.join('\n'));
+}
+
+void HubFrame::openFiles(const QStringList& paths) {
+    for (const QString& path : paths)
+        Open(path);
+}
+
+void HubFrame::Open(const QString& path) {
+    const QByteArray name = QFile::encodeName(QFileInfo(path).absoluteFilePath());
+    const Busy busy;
+    if (application_.OpenDocumentFile(name.constData()))
+        recent_.add(path);
+    else
+        recent_.remove(QFileInfo(path).absoluteFilePath());
+    ListRecentFiles();
+}
+
+void HubFrame::OnFileNew() {
+    const auto& templates = application_.Templates();
+    if (!templates.empty())
+        templates.front()->OpenDocumentFile(nullptr);
+}
+
+void HubFrame::OnFileOpen() {
+    QStringList filters;
+    for (const CDocTemplate* docTemplate : application_.Templates()) {
+        const QString name = toQt(docTemplate->GetDocString(CDocTemplate::DocString::FilterName));
+        const QString ending = toQt(docTemplate->GetDocString(CDocTemplate::DocString::FilterExtension));
+        filters.append(
+            QString("%1 (*%2 *%3)").arg(name.section('(', 0, 0).trimmed(), ending, ending.toUpper()));
+    }
+    openFiles(screen_.askOpenNames(filters.join(";;")));
+}
+
+void HubFrame::OnExit() {
+    OnClose();
+}
+
+void HubFrame::OnAbout() {
+    QStringList editors;
+    for (const PlugIn& plugIn : plugIns_)
+        editors.append(toQt(plugIn.editorName()));
+    const QString text =
+        QString("KOTAHub %1\n\nEditors: %2")
+            .arg(QApplication::applicationVersion(), editors.isEmpty() ? "none" : editors.join(", "));
+    MessageBox(toPlatform(text).constData(), "About KOTAHub");
+}
+
+bool HubFrame::OpenRecent(UINT id, int notification) {
+    const int place = static_cast<int>(id) - static_cast<int>(ID_FILE_MRU_FILE1);
+    if (place < 0 || place >= recent_.paths().size())
+        return false;
+    if (notification == 0)
+        Open(recent_.paths()[place]);
+    return true;
+}
+
+BOOL HubFrame::OnCmdMsg(UINT id, int notification) {
+    static constexpr auto commands = kota::commandMap<HubFrame>({
+        {ID_FILE_NEW, 0, &HubFrame::OnFileNew},
+        {ID_FILE_OPEN, 0, &HubFrame::OnFileOpen},
+        {ID_APP_EXIT, 0, &HubFrame::OnExit},
+        {ID_APP_ABOUT, 0, &HubFrame::OnAbout},
+    });
+    return runCommand(*this, commands, id, notification) || OpenRecent(id, notification) ||
+           CKhMDIFrameWnd::OnCmdMsg(id, notification);
+}
+
+LRESULT HubFrame::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
+    if (message == showToolbarMessage() || message == hideToolbarMessage()) {
+        ShowToolBar(wParam, message == showToolbarMessage());
+        return 0;
+    }
+    if (message == switchBoardMessage() || message == communicationMessage())
+        return 0;
+    return CKhMDIFrameWnd::WindowProc(message, wParam, lParam);
+}
+
+void HubFrame::ShowToolBar(WPARAM firstCommand, bool show) {
+    for (const auto& toolBar : toolBars_)
+        if (toolBar->HasCommand(static_cast<UINT>(firstCommand)))
+            toolBar->ShowWindow(show);
+}
+
+void HubFrame::OnUpdateFrameMenu(const CDocTemplate* front) {
+    CKhMDIFrameWnd::OnUpdateFrameMenu(front);
+    ListRecentFiles();
+}
+
+// In the place of the entry that stands for them.
+void HubFrame::ListRecentFiles() {
+    const QStringList& paths = recent_.paths();
+    std::vector<CMenu::Command> entries;
+    for (qsizetype i = 0; i < paths.size(); ++i) {
+        const QString name = QString(QFileInfo(paths[i]).fileName()).replace("&", "&&");
+        const QString folder = QString(QFileInfo(paths[i]).path()).replace("&", "&&");
+        entries.push_back({ID_FILE_MRU_FILE1 + static_cast<UINT>(i),
+                           toPlatform(QString("&%1 %2 - %3").arg(i + 1).arg(name, folder)).constData()});
+    }
+    if (!entries.empty())
+        GetMenu()->ReplaceCommands(ID_FILE_MRU_FILE1, ID_FILE_MRU_FILE1 + RecentFiles::most, entries);
+    DrawMenuBar();
+}
+
+void HubFrame::PostNcDestroy() {
+    QCoreApplication::quit();
+}
+
+} // namespace kota::hub

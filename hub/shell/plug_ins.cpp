@@ -1,0 +1,33 @@
+#include "hub/shell/plug_ins.h"
+
+#include "platform/language/language.h"
+
+#include <QCoreApplication>
+#include <QDir>
+
+#include <stdexcept>
+
+namespace kota::hub {
+
+QString plugInFolder() {
+    const QString wanted = qEnvironmentVariable("KOTA_PLUGINS");
+    return wanted.isEmpty() ? QDir::cleanPath(QCoreApplication::applicationDirPath() + "/../lib/kota/plugins")
+                            : wanted;
+}
+
+PlugIns loadPlugIns(const QString& folder) {
+    addLanguageFolder(QFile::encodeName(folder).constData());
+    PlugIns plugIns;
+    for (const QFileInfo& file : QDir(folder).entryInfoList({"lib*.so"}, QDir::Files, QDir::Name)) {
+        try {
+            plugIns.loaded.emplace_back(QFile::encodeName(file.absoluteFilePath()).toStdString());
+        } catch (const std::runtime_error& error) {
+            plugIns.problems.append(QString("%1 could not be loaded: %2").arg(file.fileName(), error.what()));
+        }
+    }
+    if (plugIns.loaded.empty() && plugIns.problems.empty())
+        plugIns.problems.append(QString("There is no editor in %1.").arg(folder));
+    return plugIns;
+}
+
+} // namespace kota::hub

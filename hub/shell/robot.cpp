@@ -1,0 +1,144 @@
+#include "hub/shell/robot.h"
+
+#include <QApplication>
+#include <QLineEdit>
+#include <QMenuBar>
+#include <QMouseEvent>
+#include <QPainter>
+#include <QTabBar>
+#include <QTableView>
+#include <QTimer>
+
+#include <stdexcept>
+#include <utility>
+
+namespace kota::hub {
+
+namespace {
+
+std::runtime_error missing(const QString& what) {
+    return std::runtime_error(QString("there is no %1 to be seen").arg(what).toStdString());
+}
+
+} // namespace
+
+void Robot::settle() {
+    for (int round = 0; round < 5; ++round)
+        QCoreApplication::processEvents();
+}
+
+void Robot::press(int key, Qt::KeyboardModifiers held) {
+    QWidget* const focus = QApplication::focusWidget();
+    QWidget* const target = focus ? focus : QApplication::activeWindow();
+    if (!target)
+        throw missing("window for a key");
+    QKeyEvent down(QEvent::KeyPress, key, held);
+    QCoreApplication::sendEvent(target, &down);
+    settle();
+}
+
+void Robot::type(const QString& text) {
+    for (const QChar letter : text) {
+        QWidget* const focus = QApplication::focusWidget();
+        if (!focus)
+            throw missing("widget for a text");
+        QKeyEvent down(QEvent::KeyPress, letter.toUpper().unicode(), Qt::NoModifier, QString(letter));
+        QCoreApplication::sendEvent(focus, &down);
+        settle();
+    }
+}
+
+void Robot::click(QWidget& widget, QPoint at) {
+    widget.window()->activateWindow(); // as a window manager does
+    settle();
+    for (const QEvent::Type type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease}) {
+        const Qt::MouseButtons held = type == QEvent::MouseButtonPress ? Qt::LeftButton : Qt::NoButton;
+        QMouseEvent event(type, QPointF(at), QPointF(widget.mapToGlobal(at)), Qt::LeftButton, held,
+                          Qt::NoModifier);
+        QCoreApplication::sendEvent(&widget, &event);
+    }
+    settle();
+}
+
+template <class Widget>
+Widget& Robot::visible(const char* what) const {
+    for (Widget* const widget : window_.findChildren<Widget*>())
+        if (widget->isVisible())
+            return *widget;
+    throw missing(what);
+}
+
+void Robot::clickTab(const QString& caption) {
+    auto& bar = visible<QTabBar>("row of tabs");
+    for (int i = 0; i < bar.count(); ++i)
+        if (bar.tabText(i) == caption) {
+            click(bar, bar.tabRect(i).center());
+            return;
+        }
+    throw missing("tab " + caption);
+}
+
+int Robot::lineCount() const {
+    return visible<QTableView>("grid").model()->rowCount();
+}
+
+void Robot::clickCell(int line, int column) {
+    auto& grid = visible<QTableView>("grid");
+    const QModelIndex cell = grid.model()->index(line - 1, column - 1);
+    grid.scrollTo(cell);
+    click(*grid.viewport(), grid.visualRect(cell).center());
+}
+
+void Robot::choose(const QString& menu, const QString& entry) {
+    for (const QAction* const popup : window_.menuBar()->actions()) {
+        if (QString(popup->text()).remove('&') != menu || !popup->isEnabled())
+            continue;
+        for (QAction* const action : popup->menu()->actions())
+            if (QString(action->text()).remove('&').section('\t', 0, 0) == entry && action->isEnabled()) {
+                action->trigger();
+                settle();
+                return;
+            }
+    }
+    throw missing(menu + ", " + entry);
+}
+
+void Robot::fill(const QString& label, const QString& text) {
+    for (QLineEdit* const line : window_.findChildren<QLineEdit*>()) {
+        if (!line->isVisible() || line->accessibleName() != label)
+            continue;
+        click(*line, line->rect().center());
+        press(Qt::Key_A, Qt::ControlModifier);
+        type(text);
+        return;
+    }
+    throw missing("field " + label);
+}
+
+void Robot::answerNext(std::function<void(QWidget&)> answer) {
+    auto* const timer = new QTimer(&window_);
+    QObject::connect(timer, &QTimer::timeout, timer, [timer, act = std::move(answer)] {
+        QWidget* const modal = QApplication::activeModalWidget();
+        if (!modal || !modal->isVisible())
+            return;
+        timer->stop();
+        timer->deleteLater();
+        act(*modal);
+    });
+    timer->start();
+}
+
+QPixmap Robot::picture() const {
+    QPixmap whole = window_.grab();
+    if (QWidget* const modal = QApplication::activeModalWidget()) {
+        QPainter painter(&whole);
+        const QPoint at = window_.mapFromGlobal(modal->mapToGlobal(QPoint(0, 0)));
+        const QRect room(at, modal->size());
+        painter.drawPixmap(at, modal->grab());
+        painter.setPen(modal->palette().color(QPalette::Shadow));
+        painter.drawRect(room.adjusted(-1, -1, 0, 0));
+    }
+    return whole;
+}
+
+} // namespace kota::hub

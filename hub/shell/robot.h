@@ -1,0 +1,43 @@
+#pragma once
+
+#include <QMainWindow>
+#include <QString>
+
+#include <functional>
+
+namespace kota::hub {
+
+// A user at mouse and keyboard, for the tour: it sends the toolkit's own events to the widgets that are
+// there. What it does not find is an error (std::runtime_error).
+class Robot {
+public:
+    explicit Robot(QMainWindow& window) : window_(window) {}
+
+    // Lets everything happen that was set going.
+    static void settle();
+    // To the widget with the focus.
+    static void press(int key, Qt::KeyboardModifiers held = Qt::NoModifier);
+    static void type(const QString& text);
+    void clickTab(const QString& caption);
+    // How many lines the grid in front has.
+    int lineCount() const;
+    // A cell of the grid in front, lines and columns from 1.
+    void clickCell(int line, int column);
+    // An entry of the menu bar, by the texts without their "&".
+    void choose(const QString& menu, const QString& entry);
+    // Writes into the field of that label, in place of what it holds.
+    void fill(const QString& label, const QString& text);
+    // What the user does with the next box or dialog, once it is open. Call it before what opens the box.
+    void answerNext(std::function<void(QWidget&)> answer);
+    // The window as it is to be seen, with what stands in front of it.
+    QPixmap picture() const;
+
+private:
+    static void click(QWidget& widget, QPoint at);
+    template <class Widget>
+    Widget& visible(const char* what) const;
+
+    QMainWindow& window_;
+};
+
+} // namespace kota::hub

@@ -1,0 +1,150 @@
+#include "hub/shell/tour.h"
+
+#include "hub/shell/robot.h"
+#include "platform/framework/document.h"
+
+#include <QAbstractButton>
+#include <QDir>
+#include <QFileInfo>
+#include <QMessageBox>
+#include <QTabBar>
+#include <QTextStream>
+
+#include <stdexcept>
+
+namespace kota::hub {
+
+namespace {
+
+class Tour {
+public:
+    Tour(HubFrame& frame, QMainWindow& window, const QDir& folder)
+        : frame_(frame), window_(window), robot_(window), folder_(folder) {}
+
+    void play(const QString& document) {
+        copy_ = folder_.filePath(QFileInfo(document).fileName());
+        QFile::remove(copy_);
+        if (!QFile::copy(document, copy_))
+            throw std::runtime_error(("cannot copy " + document + " to " + copy_).toStdString());
+        open("The example is open");
+        visitTabs();
+        renameComponent();
+        insertDecayLine();
+        breachBounds();
+        saveAndReopen();
+    }
+
+private:
+    void step(const QString& what) {
+        const QString name =
+            QString("%1 %2.png").arg(++count_, 2, 10, QChar('0')).arg(QString(what).remove('"'));
+        if (!robot_.picture().save(folder_.filePath(name)))
+            throw std::runtime_error(("cannot write " + folder_.filePath(name)).toStdString());
+        QTextStream(stdout) << "  " << name << Qt::endl;
+    }
+
+    static void expect(bool held, const char* what) {
+        if (!held)
+            throw std::runtime_error(what);
+    }
+
+    void open(const QString& what) {
+        frame_.openFiles({copy_});
+        Robot::settle();
+        expect(frame_.MDIGetActive() != nullptr, "the document did not open");
+        step(what);
+    }
+
+    void visitTabs() {
+        const auto tabs = captions();
+        for (const QString& caption : tabs) {
+            robot_.clickTab(caption);
+            step("Tab " + caption);
+        }
+    }
+
+    QStringList captions() const {
+        QStringList all;
+        const auto* const bar = window_.findChild<QTabBar*>();
+        for (int i = 0; bar && i < bar->count(); ++i)
+            all.append(bar->tabText(i));
+        return all;
+    }
+
+    void renameComponent() {
+        robot_.clickTab("Components");
+        robot_.clickCell(1, 1);
+        Robot::type("oxygen demand");
+        step("A component gets another name");
+        Robot::press(Qt::Key_Return);
+        step("It is in upper case");
+    }
+
+    void insertDecayLine() {
+        robot_.clickTab("Decay");
+        robot_.clickCell(1, 2);
+        Robot::press(Qt::Key_Insert);
+        step("A decay line is inserted");
+        const int line = robot_.lineCount();
+        robot_.clickCell(line, 1);
+        Robot::type("d");
+        step("Its component is chosen by a letter");
+        robot_.clickCell(line, 2);
+        Robot::type("0.0x");
+        Robot::press(Qt::Key_Return);
+        step("A bad number is refused at its cell");
+        Robot::press(Qt::Key_Backspace);
+        Robot::type("2");
+        Robot::press(Qt::Key_Return);
+        step("A good one is taken");
+    }
+
+    void breachBounds() {
+        robot_.clickTab("Dispersion");
+        robot_.fill("Minimum disp. coefficient", "99999");
+        robot_.answerNext([this](QWidget& box) {
+            step("The minimum is above the maximum, and the tab stays");
+            dynamic_cast<QMessageBox&>(box).buttons().first()->click();
+        });
+        robot_.clickTab("Decay");
+        robot_.fill("Minimum disp. coefficient", "10");
+        step("The minimum is mended");
+        robot_.clickTab("Decay");
+    }
+
+    void saveAndReopen() {
+        Robot::press(Qt::Key_S, Qt::ControlModifier);
+        expect(!frame_.MDIGetActive()->GetActiveDocument()->IsModified(), "the document was not saved");
+        step("The document is saved");
+        robot_.choose("File", "Close");
+        expect(frame_.MDIGetActive() == nullptr, "the document did not close");
+        step("The document is closed");
+        open("The saved document is open again");
+        robot_.clickTab("Decay");
+        step("The inserted decay line is there again");
+    }
+
+    HubFrame& frame_;
+    QMainWindow& window_;
+    Robot robot_;
+    QDir folder_;
+    QString copy_;
+    int count_ = 0;
+};
+
+} // namespace
+
+int takeTour(HubFrame& frame, QMainWindow& window, const QString& document, const QString& folder) {
+    try {
+        if (!QDir().mkpath(folder))
+            throw std::runtime_error(("cannot make the folder " + folder).toStdString());
+        QTextStream(stdout) << "Pictures in " << QDir(folder).absolutePath() << ':' << Qt::endl;
+        Tour(frame, window, QDir(folder)).play(document);
+        return 0;
+    } catch (const std::runtime_error& error) {
+        QTextStream(stderr) << "The tour ended early: " << error.what() << Qt::endl;
+        return 1;
+    }
+}
+
+} // namespace kota::hub
