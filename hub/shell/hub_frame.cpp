@@ -130,8 +130,20 @@ BOOL HubFrame::OnCmdMsg(UINT id, int notification) {
         {ID_APP_EXIT, 0, &HubFrame::OnExit},
         {ID_APP_ABOUT, 0, &HubFrame::OnAbout},
     });
-    return runCommand(*this, commands, id, notification) || OpenRecent(id, notification) ||
-           CKhMDIFrameWnd::OnCmdMsg(id, notification);
+    const BOOL done = runCommand(*this, commands, id, notification) || OpenRecent(id, notification) ||
+                      CKhMDIFrameWnd::OnCmdMsg(id, notification);
+    if (notification == 0 && (id == ID_FILE_SAVE || id == ID_FILE_SAVE_AS))
+        NoteSaved();
+    return done;
+}
+
+void HubFrame::NoteSaved() {
+    const CMDIChildWnd* const front = MDIGetActive();
+    CDocument* const document = front ? front->GetActiveDocument() : nullptr;
+    if (!document || document->IsModified() || document->GetPathName().IsEmpty())
+        return;
+    recent_.add(QFile::decodeName(QByteArray(document->GetPathName())));
+    ListRecentFiles();
 }
 
 LRESULT HubFrame::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {

@@ -39,6 +39,8 @@ private:
     void OnAbout();
     bool OpenRecent(UINT id, int notification);
     void Open(const QString& path);
+    // After a save of the document in front: its file may have got another name.
+    void NoteSaved();
     void ListRecentFiles();
     void ShowToolBar(WPARAM firstCommand, bool show);
 

@@ -4,7 +4,9 @@
 
 #include <QApplication>
 #include <QCommandLineParser>
-#include <QIcon>
+
+#include <memory>
+#include <span>
 
 namespace {
 
@@ -33,11 +35,19 @@ int runHub(const QStringList& files, const QString& tourFolder) {
     return result;
 }
 
+// A question about the program itself needs no display.
+std::unique_ptr<QCoreApplication> makeApplication(int& argc, char** argv) {
+    for (const QByteArray argument : std::span(argv, static_cast<std::size_t>(argc)))
+        if (argument == "--help" || argument == "--version")
+            return std::make_unique<QCoreApplication>(argc, argv);
+    QApplication::setStyle("Fusion");
+    return std::make_unique<QApplication>(argc, argv);
+}
+
 } // namespace
 
 int main(int argc, char** argv) {
-    QApplication::setStyle("Fusion");
-    const QApplication application(argc, argv);
+    const auto application = makeApplication(argc, argv);
     QCoreApplication::setOrganizationName("KOTA");
     QCoreApplication::setApplicationName("KOTAHub");
     QCoreApplication::setApplicationVersion(KOTA_VERSION);
@@ -49,6 +59,6 @@ int main(int argc, char** argv) {
                                   "folder");
     options.addOption(tour);
     options.addPositionalArgument("files", "The documents to open.", "[files...]");
-    options.process(application);
+    options.process(*application);
     return runHub(options.positionalArguments(), options.value(tour));
 }
