@@ -183,7 +183,7 @@ void HubFrame::ListRecentFiles() {
 }
 
 void HubFrame::PostNcDestroy() {
-    QCoreApplication::quit();
+    QCoreApplication::exit(0); // quit() would ask the windows first, and this one is gone
 }
 
 } // namespace kota::hub
