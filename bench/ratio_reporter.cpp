@@ -7,7 +7,8 @@ namespace bench {
 void RatioReporter::ReportRuns(const std::vector<Run>& runs) {
     for (const Run& run : runs)
         if (run.run_type == Run::RT_Aggregate && run.aggregate_name == "median")
-            medians_[run.run_name.function_name + "/" + run.run_name.args] = run.GetAdjustedRealTime();
+            medians_[run.run_name.function_name + (run.run_name.args.empty() ? "" : "/") +
+                     run.run_name.args] = run.GetAdjustedRealTime();
     ConsoleReporter::ReportRuns(runs);
 }
 

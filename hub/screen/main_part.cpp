@@ -19,9 +19,8 @@ namespace kota::hub {
 
 namespace {
 
-constexpr std::array screenCommands = {ID_VIEW_TOOLBAR,   ID_VIEW_STATUS_BAR,  ID_WINDOW_CASCADE,
-                                       ID_WINDOW_ARRANGE, ID_WINDOW_TILE_HORZ, ID_NEXT_PANE,
-                                       ID_PREV_PANE};
+constexpr std::array screenCommands = {ID_VIEW_TOOLBAR, ID_VIEW_STATUS_BAR, ID_WINDOW_CASCADE,
+                                       ID_WINDOW_ARRANGE, ID_WINDOW_TILE_HORZ};
 
 bool isToggle(UINT id) {
     return id == ID_VIEW_TOOLBAR || id == ID_VIEW_STATUS_BAR;
@@ -157,12 +156,6 @@ void MainPart::runOwn(UINT id) {
         break;
     case ID_WINDOW_TILE_HORZ:
         area_->tileSubWindows();
-        break;
-    case ID_NEXT_PANE:
-        area_->activateNextSubWindow();
-        break;
-    case ID_PREV_PANE:
-        area_->activatePreviousSubWindow();
         break;
     default:
         for (QMdiSubWindow* const shown : area_->subWindowList())

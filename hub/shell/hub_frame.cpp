@@ -11,6 +11,8 @@
 #include <QApplication>
 #include <QFileInfo>
 
+#include <algorithm>
+
 namespace kota::hub {
 
 IMPLEMENT_DYNAMIC(HubFrame, CKhMDIFrameWnd, hubModule)
@@ -75,12 +77,22 @@ void HubFrame::openFiles(const QStringList& paths) {
 
 void HubFrame::Open(const QString& path) {
     const QByteArray name = QFile::encodeName(QFileInfo(path).absoluteFilePath());
+    if (!HasEditorFor(path))
+        tell(QString("%1 cannot be opened: no editor here is for files of its kind.").arg(path));
     const Busy busy;
     if (application_.OpenDocumentFile(name.constData()))
         recent_.add(path);
     else
         recent_.remove(QFileInfo(path).absoluteFilePath());
     ListRecentFiles();
+}
+
+bool HubFrame::HasEditorFor(const QString& path) const {
+    const QString ending = "." + QFileInfo(path).suffix();
+    return std::ranges::any_of(application_.Templates(), [&](const CDocTemplate* docTemplate) {
+        const CString own = docTemplate->GetDocString(CDocTemplate::DocString::FilterExtension);
+        return ending.compare(toQt(own), Qt::CaseInsensitive) == 0;
+    });
 }
 
 void HubFrame::OnFileNew() {
@@ -177,8 +189,9 @@ void HubFrame::ListRecentFiles() {
         entries.push_back({ID_FILE_MRU_FILE1 + static_cast<UINT>(i),
                            toPlatform(QString("&%1 %2 - %3").arg(i + 1).arg(name, folder)).constData()});
     }
-    if (!entries.empty())
-        GetMenu()->ReplaceCommands(ID_FILE_MRU_FILE1, ID_FILE_MRU_FILE1 + RecentFiles::most, entries);
+    if (paths.isEmpty())
+        entries.push_back({ID_FILE_MRU_FILE1, "Recent File"});
+    GetMenu()->ReplaceCommands(ID_FILE_MRU_FILE1, ID_FILE_MRU_FILE1 + RecentFiles::most, entries);
     DrawMenuBar();
 }
 

@@ -39,6 +39,7 @@ private:
     void OnAbout();
     bool OpenRecent(UINT id, int notification);
     void Open(const QString& path);
+    bool HasEditorFor(const QString& path) const;
     // After a save of the document in front: its file may have got another name.
     void NoteSaved();
     void ListRecentFiles();

@@ -63,9 +63,19 @@ const Resources* resourcesOf(HINSTANCE library) {
 
 namespace {
 
-std::vector<const CDynLinkLibrary*>& knownLibraries() {
-    static std::vector<const CDynLinkLibrary*> libraries;
-    return libraries;
+// The entries, which their libraries do not delete.
+struct KnownLibraries {
+    std::vector<CDynLinkLibrary*> entries;
+
+    ~KnownLibraries() {
+        for (const CDynLinkLibrary* entry : std::exchange(entries, {}))
+            delete entry;
+    }
+};
+
+std::vector<CDynLinkLibrary*>& knownLibraries() {
+    static KnownLibraries known;
+    return known.entries;
 }
 
 } // namespace
@@ -82,6 +92,8 @@ BOOL FreeLibrary(HINSTANCE library) {
     const auto found = std::ranges::find(loaded, library, &std::unique_ptr<kota::Library>::get);
     if (found == loaded.end())
         return FALSE;
+    // What is unloaded may free a library itself.
+    const std::unique_ptr<kota::Library> freed = std::move(*found);
     loaded.erase(found);
     return TRUE;
 }

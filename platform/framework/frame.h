@@ -4,6 +4,7 @@
 #include "platform/framework/resources.h"
 #include "platform/framework/view.h"
 
+#include <cstddef>
 #include <vector>
 
 class CDocTemplate;
@@ -86,7 +87,8 @@ public:
     // Closes the frames first, and stays if one of them does.
     void OnClose() override;
     CMenu* GetMenu() override { return &menu_; }
-    // A command goes to the frame in front first. "New Window" is the main window's own.
+    // A command goes to the frame in front first. The main window's own are "New Window", and
+    // the next and the previous frame.
     BOOL OnCmdMsg(UINT id, int notification) override;
 
     // Shows the menu that goes with a frame, with its top entries enabled as they were when it was shown
@@ -106,6 +108,10 @@ protected:
 
 private:
     void OnWindowNew();
+    void OnNextPane();
+    void OnPreviousPane();
+    // Brings the frame so many places behind the one in front to the front, round the end.
+    void ActivateBeside(std::ptrdiff_t step);
 
     CMenu menu_;
     HWND menuOf_ = nullptr;

@@ -139,11 +139,34 @@ void CMDIFrameWnd::OnClose() {
 }
 
 BOOL CMDIFrameWnd::OnCmdMsg(UINT id, int notification) {
-    static constexpr auto commands =
-        kota::commandMap<CMDIFrameWnd>({{ID_WINDOW_NEW, 0, &CMDIFrameWnd::OnWindowNew}});
+    static constexpr auto commands = kota::commandMap<CMDIFrameWnd>({
+        {ID_WINDOW_NEW, 0, &CMDIFrameWnd::OnWindowNew},
+        {ID_NEXT_PANE, 0, &CMDIFrameWnd::OnNextPane},
+        {ID_PREV_PANE, 0, &CMDIFrameWnd::OnPreviousPane},
+    });
     CMDIChildWnd* const child = MDIGetActive();
     return (child && child->OnCmdMsg(id, notification)) ||
-           kota::runCommand(*this, commands, id, notification) || CFrameWnd::OnCmdMsg(id, notification);
+           (child && kota::runCommand(*this, commands, id, notification)) ||
+           CFrameWnd::OnCmdMsg(id, notification);
+}
+
+void CMDIFrameWnd::OnNextPane() {
+    ActivateBeside(1);
+}
+void CMDIFrameWnd::OnPreviousPane() {
+    ActivateBeside(-1);
+}
+
+void CMDIFrameWnd::ActivateBeside(std::ptrdiff_t step) {
+    CDocument* const document = MDIGetActive()->GetActiveDocument();
+    if (document && !document->TakePendingInput())
+        return;
+    const std::vector<CMDIChildWnd*> frames = Children();
+    const auto here = std::ranges::find(frames, MDIGetActive());
+    if (here == frames.end())
+        return;
+    const auto count = std::ssize(frames);
+    frames[static_cast<std::size_t>((here - frames.begin() + step + count) % count)]->ActivateFrame();
 }
 
 void CMDIFrameWnd::OnWindowNew() {

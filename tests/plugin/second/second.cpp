@@ -1,0 +1,132 @@
+#include "platform/foundation/frames.h"
+#include "platform/framework/document.h"
+#include "platform/framework/extension.h"
+#include "platform/framework/template.h"
+#include "platform/language/language.h"
+#include "tests/plugin/second/ids.h"
+
+#include <memory>
+
+// A plug-in that does next to nothing, with the numbers and the class names of the first one.
+namespace {
+
+constinit AFX_EXTENSION_MODULE record;
+
+constexpr kota::StringResource strings[] = {
+    {Second::Document,
+     "Second.chm\nSecond\nNew second\nSeconds (*.second)\n.second\nSecond.Document\nA second"},
+    {Second::EditorName, "Plain name"},
+    {Second::ToolBarName, "Plain tools"},
+    {Second::Command, "Plain prompt.\nPlain tip"},
+    {Second::OwnCommand, "Plain prompt of its own."},
+};
+
+constexpr kota::MenuItemTemplate items[] = {{Second::Command, "&Plain command"}};
+constexpr kota::MenuPopupTemplate popups[] = {{"&File", items}, {"&Plain", items}};
+constexpr kota::MenuTemplate menus[] = {{.id = Second::Document, .popups = popups}};
+
+constexpr kota::Accelerator keys[] = {
+    {.key = VK_F6, .command = Second::Command},
+    {.key = 'S', .command = Second::Command, .control = true},
+};
+constexpr kota::AcceleratorTable tables[] = {{.id = Second::Keys, .keys = keys}};
+
+constexpr UINT commands[] = {Second::OwnCommand};
+constexpr kota::ToolBarTemplate bars[] = {
+    {.id = Second::Document, .buttonWidth = 16, .buttonHeight = 15, .commands = commands}};
+
+const kota::Module& secondModule() {
+    static const kota::Module module(
+        "second", {.strings = strings, .menus = menus, .accelerators = tables, .toolBars = bars}, &record);
+    return module;
+}
+
+int commandsRun = 0;
+
+class CKota0_adDoc : public CDocument {
+    DECLARE_DYNCREATE(CKota0_adDoc)
+public:
+    BOOL OnOpenDocument(const char* /*path*/) override { return TRUE; }
+    BOOL OnSaveDocument(const char* /*path*/) override { return TRUE; }
+    BOOL DoSave(const char* /*path*/) override { return TRUE; }
+};
+IMPLEMENT_DYNCREATE(CKota0_adDoc, CDocument, secondModule)
+
+class CDlgFrame : public CKhMDIChildWnd {
+    DECLARE_DYNCREATE(CDlgFrame)
+};
+IMPLEMENT_DYNCREATE(CDlgFrame, CKhMDIChildWnd, secondModule)
+
+class CKota0_adView : public CView {
+    DECLARE_DYNCREATE(CKota0_adView)
+public:
+    BOOL OnCmdMsg(UINT id, int notification) override {
+        static constexpr auto map =
+            kota::commandMap<CKota0_adView>({{Second::Command, 0, &CKota0_adView::OnCommand}});
+        return kota::runCommand(*this, map, id, notification) || CView::OnCmdMsg(id, notification);
+    }
+
+private:
+    void OnCommand() { ++commandsRun; }
+};
+IMPLEMENT_DYNCREATE(CKota0_adView, CView, secondModule)
+
+class Attachment {
+public:
+    Attachment() {
+        AfxInitExtensionModule(record, nullptr);
+        language_ = KhLangLoadResDll("Second", &record.resources, 0);
+        new CDynLinkLibrary(record); // the framework's
+    }
+    ~Attachment() { FreeLibrary(language_); }
+    Attachment(const Attachment&) = delete;
+    Attachment& operator=(const Attachment&) = delete;
+
+private:
+    HINSTANCE language_ = nullptr;
+};
+const Attachment attachment;
+
+} // namespace
+
+extern "C" {
+
+KOTA_EXPORT int KhGetNumDocTemplates() {
+    return 1;
+}
+KOTA_EXPORT CMultiDocTemplate* KhGetDocTemplatePtr(int index) {
+    return index == 0 ? new CMultiDocTemplate(Second::Document, RUNTIME_CLASS(CKota0_adDoc),
+                                              RUNTIME_CLASS(CDlgFrame), RUNTIME_CLASS(CKota0_adView))
+                      : nullptr;
+}
+KOTA_EXPORT int KhGetNumToolbars() {
+    return 1;
+}
+KOTA_EXPORT CKhToolBarEx* KhCreateToolbar(CKhMDIFrameWnd* frame, unsigned style, unsigned id, int /*index*/) {
+    auto bar = std::make_unique<CKhToolBarEx>();
+    return bar->Create(frame, style, id) && bar->LoadToolBar(secondModule(), Second::Document) ? bar.release()
+                                                                                               : nullptr;
+}
+KOTA_EXPORT int KhInitToolbar(CKhToolBarEx*, CKhMDIFrameWnd*, unsigned, unsigned, unsigned) {
+    return 0;
+}
+KOTA_EXPORT unsigned KhGetBitmapId() {
+    return 0;
+}
+KOTA_EXPORT int KhGetEditorString(CString* out) {
+    *out = secondModule().string(Second::EditorName);
+    return 1;
+}
+KOTA_EXPORT int KhGetToolbarString(CString* out, int /*index*/) {
+    *out = secondModule().string(Second::ToolBarName);
+    return 1;
+}
+
+// For tests.
+KOTA_EXPORT AFX_EXTENSION_MODULE* SecondRecord() {
+    return &record;
+}
+KOTA_EXPORT int SecondCommandsRun() {
+    return commandsRun;
+}
+}
