@@ -53,6 +53,12 @@ MainPart::MainPart(Parts& parts, HWND window) : Part(parts, window, new Window(*
     QObject::connect(area_, &QMdiArea::subWindowActivated, this, &MainPart::activated);
 }
 
+MainPart::~MainPart() {
+    // The area activates one frame after another while it goes with the widget, and this is no main part
+    // then.
+    area_->disconnect(this);
+}
+
 CMDIFrameWnd* MainPart::frame() const {
     return static_cast<CMDIFrameWnd*>(CWnd::FromHandle(window()));
 }

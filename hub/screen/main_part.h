@@ -19,6 +19,7 @@ namespace kota::hub {
 class MainPart : public Part {
 public:
     MainPart(Parts& parts, HWND window);
+    ~MainPart() override;
 
     void add(Part& child) override;
     void settle() override;

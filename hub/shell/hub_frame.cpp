@@ -7,6 +7,7 @@
 #include "platform/framework/message_box.h"
 #include "platform/framework/messages.h"
 #include "platform/framework/template.h"
+#include "platform/framework/turn.h"
 
 #include <QApplication>
 #include <QFileInfo>
@@ -49,7 +50,10 @@ HubFrame::HubFrame(CWinApp& application, QtScreen& screen) : application_(applic
     application_.SetMainWnd(this);
 }
 
-HubFrame::~HubFrame() = default;
+HubFrame::~HubFrame() {
+    const Turn turn; // at whose end the documents' frames are deleted
+    HubFrame::DestroyWindow();
+}
 
 void HubFrame::load(PlugIns plugIns) {
     plugIns_ = std::move(plugIns.loaded);

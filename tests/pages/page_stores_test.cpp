@@ -79,6 +79,7 @@ protected:
     }
     double storedConstant() { return recordOf(document.decayList).decayConst; }
 
+    kota::Turn turn; // at whose end the controls' plain objects are deleted
     kota::test::OwnedDocument document;
     CPropertySheet sheet;
     RefusingPage page{&document};
