@@ -30,6 +30,7 @@ public:
         return IDOK;
     }
     std::optional<CString> askSaveName(const CString& /*proposal*/) override { return std::nullopt; }
+    void showDialog(CDialog& /*dialog*/) override { std::abort(); } // no file may open one
 
     int boxes = 0;
 };
