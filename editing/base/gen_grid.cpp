@@ -106,6 +106,18 @@ void CGenGrid::OnModifyCell(ROWCOL row, ROWCOL col) {
     CGXGridWnd::OnModifyCell(row, col);
 }
 
+BOOL CGenGrid::AppendLine() {
+    const ROWCOL before = GetRowCount();
+    if (ownerPage)
+        ownerPage->InsertDefaultLine();
+    return GetRowCount() > before;
+}
+
+void CGenGrid::DeleteSelection() {
+    if (GridOwner* const owner = Owner())
+        owner->OnGridDeleteLine();
+}
+
 bool CGenGrid::LetFocusGo() {
     if (!cellEdited)
         return CGXGridWnd::LetFocusGo();

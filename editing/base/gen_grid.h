@@ -42,6 +42,9 @@ public:
     BOOL ProcessKeys(CWnd* window, UINT message, UINT key, UINT repeat, UINT flags) override;
     BOOL OnStartEditing(ROWCOL row, ROWCOL col) override;
     void OnModifyCell(ROWCOL row, ROWCOL col) override;
+    // Pasted lines come and cut lines go by way of the page, as if the user asked for them.
+    BOOL AppendLine() override;
+    void DeleteSelection() override;
     // What was modified is reported before the focus goes.
     bool LetFocusGo() override;
 

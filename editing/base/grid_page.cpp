@@ -6,6 +6,25 @@
 
 IMPLEMENT_DYNAMIC(CGridPage, CGenPropertyPage, kota0AdModule)
 
+namespace {
+
+// What is done to a grid while one lives can not be undone, nor what was done before.
+class WithoutUndo {
+public:
+    explicit WithoutUndo(CGenGrid& grid) : param_(*grid.GetParam()), before_(param_.IsUndoEnabled()) {
+        param_.EnableUndo(FALSE);
+    }
+    ~WithoutUndo() { param_.EnableUndo(before_); }
+    WithoutUndo(const WithoutUndo&) = delete;
+    WithoutUndo& operator=(const WithoutUndo&) = delete;
+
+private:
+    CGXGridParam& param_;
+    bool before_;
+};
+
+} // namespace
+
 CGridPage::CGridPage(CKota0_adDoc* owner, UINT dialogId) : CGenPropertyPage(owner, dialogId) {}
 CGridPage::~CGridPage() = default;
 
@@ -92,6 +111,7 @@ void CGridPage::FillFromDocument(CKota0_adDoc* source) {
         if (part->Face().componentColumn != 0)
             part->SetComponentChoices(ComponentColumnChoices(part->Face().kindFilter));
     for (const auto& part : parts_) {
+        const WithoutUndo scope(part->Grid());
         if (part->HasRecords(*source)) {
             part->FillLines(*source);
         } else {

@@ -11,6 +11,18 @@ Screen* theScreen = nullptr;
 Screen::Screen() = default;
 Screen::~Screen() = default;
 
+CString Screen::clipboardText() const {
+    return clipboard_;
+}
+void Screen::setClipboardText(const CString& text) {
+    clipboard_ = text;
+}
+bool Screen::editText(UINT /*command*/, bool /*asked*/) {
+    return false;
+}
+bool Screen::usesDecimalComma() const {
+    return false;
+}
 void Screen::windowsChanged(std::span<const WindowChange> /*changes*/) {}
 void Screen::changesPending() {}
 

@@ -13,6 +13,7 @@ namespace {
 
 struct Pending {
     int depth = 0;
+    unsigned number = 0;
     std::vector<MSG> posted;
     std::vector<CObject*> doomed;
     std::vector<WindowChange> changes;
@@ -43,7 +44,8 @@ void deleteDoomed() {
 } // namespace
 
 Turn::Turn() {
-    ++pending().depth;
+    if (pending().depth++ == 0)
+        ++pending().number;
 }
 
 Turn::~Turn() {
@@ -55,6 +57,10 @@ Turn::~Turn() {
     // What the screen itself changed while it was told, and messages that go on and on, are another turn's.
     if (pending().depth == 0 && attachedScreen() && !(pending().changes.empty() && pending().posted.empty()))
         attachedScreen()->changesPending();
+}
+
+unsigned turnNumber() {
+    return pending().number;
 }
 
 void deleteLater(CObject* object) {

@@ -19,6 +19,9 @@ public:
     Turn& operator=(const Turn&) = delete;
 };
 
+// How many outermost turns there have been, the one that runs now among them.
+KOTA_API unsigned turnNumber();
+
 // Deletes an object when nothing of it can be running any more: at the end of the outermost turn.
 KOTA_API void deleteLater(CObject* object);
 // Takes that back: somebody uses the object again before the turn ends.

@@ -1,6 +1,7 @@
 #include "platform/grid/cell_store.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace kota::grid {
 
@@ -35,14 +36,43 @@ void CellStore::insertRows(ROWCOL row, ROWCOL count) {
     heights_.insert(row, count);
 }
 
-void CellStore::removeRows(ROWCOL first, ROWCOL last) {
-    rows_ -= last - first + 1;
-    for (Column& column : columns_) {
-        column.values.erase(first, last);
-        column.styles.erase(first, last);
+TakenLines CellStore::takeRows(ROWCOL first, ROWCOL last) {
+    TakenLines taken;
+    taken.count_ = last - first + 1;
+    rows_ -= taken.count_;
+    for (Column& column : columns_)
+        taken.columns_.push_back({column.values.take(first, last), column.styles.take(first, last)});
+    taken.rowStyles_ = rowStyles_.take(first, last);
+    taken.heights_ = heights_.take(first, last);
+    return taken;
+}
+
+void CellStore::putRows(ROWCOL row, TakenLines taken) {
+    insertRows(row, taken.count_);
+    for (std::size_t col = 0; col < std::min(columns_.size(), taken.columns_.size()); ++col) {
+        columns_[col].values.put(row, std::move(taken.columns_[col].values), lines());
+        columns_[col].styles.put(row, std::move(taken.columns_[col].styles), lines());
     }
-    rowStyles_.erase(first, last);
-    heights_.erase(first, last);
+    rowStyles_.put(row, std::move(taken.rowStyles_), lines());
+    heights_.put(row, std::move(taken.heights_), lines());
+}
+
+CellContent CellStore::content(ROWCOL row, ROWCOL col) const {
+    const SmallText& own = columns_[col].values[row];
+    return {own.isSet() ? SmallText(own.view()) : SmallText(), columns_[col].styles[row]};
+}
+
+CellContent CellStore::exchange(ROWCOL row, ROWCOL col, CellContent content) {
+    Column& column = columns_[col];
+    std::swap(column.values.write(row, lines()), content.value);
+    if (content.style != column.styles[row])
+        std::swap(column.styles.write(row, lines()), content.style);
+    return content;
+}
+
+bool CellStore::holds(ROWCOL row, ROWCOL col, std::string_view text) const {
+    const SmallText& own = columns_[col].values[row];
+    return own.isSet() && own.view() == text;
 }
 
 void CellStore::setCols(ROWCOL count) {

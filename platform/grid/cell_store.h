@@ -15,6 +15,30 @@ namespace kota::grid {
 // Whether a style is kept off what is read-only.
 enum class ReadOnlyLock { Off, On };
 
+// What a cell holds of its own.
+struct CellContent {
+    SmallText value;
+    StyleId style = 0;
+};
+
+// Lines that were taken out of a store, with all that they hold.
+class TakenLines {
+public:
+    ROWCOL count() const { return count_; }
+
+private:
+    friend class CellStore;
+    struct Column {
+        LazyColumn<SmallText> values;
+        LazyColumn<StyleId> styles;
+    };
+
+    ROWCOL count_ = 0;
+    std::vector<Column> columns_;
+    LazyColumn<StyleId> rowStyles_;
+    LazyColumn<std::optional<int>> heights_;
+};
+
 // What the cells of a grid hold: values, styles, sizes, for the lines and columns from 0, the headers. A cell
 // takes 16 bytes once it or one below it in its column was written, and 4 more likewise for a style of its
 // own.
@@ -30,7 +54,9 @@ public:
     bool exists(ROWCOL row, ROWCOL col) const { return row <= rows_ && col < columns_.size(); }
     // New lines stand in front of `row`.
     void insertRows(ROWCOL row, ROWCOL count);
-    void removeRows(ROWCOL first, ROWCOL last);
+    TakenLines takeRows(ROWCOL first, ROWCOL last);
+    // Puts lines back in front of `row`.
+    void putRows(ROWCOL row, TakenLines lines);
     void setCols(ROWCOL count);
 
     // The operations below take cells, lines and columns that exist.
@@ -38,6 +64,14 @@ public:
     void setValue(ROWCOL row, ROWCOL col, std::string_view text) {
         columns_[col].values.write(row, lines()) = SmallText(text);
     }
+    CellContent content(ROWCOL row, ROWCOL col) const;
+    // Gives a cell what it is to hold of its own, for what it held.
+    CellContent exchange(ROWCOL row, ROWCOL col, CellContent content);
+    // Whether the cell has a value of its own, and it is this one.
+    bool holds(ROWCOL row, ROWCOL col, std::string_view text) const;
+    StyleId cellStyle(ROWCOL row, ROWCOL col) const { return columns_[col].styles[row]; }
+    StyleId rowStyle(ROWCOL row) const { return rowStyles_[row]; }
+    void setRowStyle(ROWCOL row, StyleId style) { rowStyles_.write(row, lines()) = style; }
     // The cell's own value, or else the uppermost of its styles. Valid until the store changes.
     std::string_view text(ROWCOL row, ROWCOL col) const;
 

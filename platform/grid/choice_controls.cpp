@@ -42,6 +42,10 @@ bool ChoiceControl::TakeText(const char* text) {
     return TakeEntry(entryMeantBy(text, choiceListOf(*Grid(), Row(), Col()).View()));
 }
 
+bool ChoiceControl::TakePasted(const char* text) {
+    return TakeText(text) || TakeEntry(numberIn(text) - base_);
+}
+
 bool ChoiceControl::TakeEntry(int index) {
     const CString list = choiceListOf(*Grid(), Row(), Col());
     const auto entry = entryAt(list.View(), index);

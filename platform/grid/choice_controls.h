@@ -13,6 +13,7 @@ public:
     CellKind Kind() const override { return CellKind::Choice; }
     void Init(ROWCOL row, ROWCOL col) override;
     bool TakeText(const char* text) override;
+    bool TakePasted(const char* text) override;
     bool TakeEntry(int index) override;
     int ChosenEntry() const override { return index_; }
     BOOL GetValue(CString& value) override;

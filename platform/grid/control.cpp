@@ -25,6 +25,9 @@ bool CGXControl::TakeText(const char* text) {
     text_ = text;
     return true;
 }
+bool CGXControl::TakePasted(const char* text) {
+    return TakeText(text);
+}
 bool CGXControl::TakeEntry(int /*index*/) {
     return false;
 }

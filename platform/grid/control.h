@@ -36,6 +36,8 @@ public:
     void SetModify(bool modified) { modified_ = modified; }
     // Takes a text of the user. False: a text of this kind cannot stand here, and nothing changed.
     virtual bool TakeText(const char* text);
+    // The same for a text that comes from elsewhere, which may also be the value that a cell stores.
+    virtual bool TakePasted(const char* text);
     // Takes the entry at a zero-based place of the cell's choice list. False when there is no such entry, and
     // in a control without a list.
     virtual bool TakeEntry(int index);

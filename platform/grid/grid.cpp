@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <ranges>
 #include <utility>
 
 IMPLEMENT_DYNAMIC(CGXGridCore, CWnd, kota::platformModule)
@@ -45,6 +46,7 @@ BOOL CGXGridCore::SetColCount(ROWCOL count, UINT /*flags*/) {
         return TRUE;
     if (data_->edit.control && data_->edit.place.col > count)
         data_->endEdit();
+    data_->journal.forget();
     data_->cells.setCols(count);
     kota::grid::clipToCols(data_->covered, count);
     data_->changeSelection([count](std::vector<CGXRange>& ranges) { kota::grid::clipToCols(ranges, count); });
@@ -77,8 +79,30 @@ BOOL CGXGridCore::RemoveRows(ROWCOL first, ROWCOL last) {
     return TRUE;
 }
 
+BOOL CGXGridCore::AppendLine() {
+    return InsertRows(GetRowCount() + 1, 1);
+}
+
+void CGXGridCore::DeleteSelection() {
+    std::vector<ROWCOL> lines;
+    GetSelectedRows(lines);
+    for (const ROWCOL line : std::views::reverse(lines))
+        RemoveRows(line, line);
+}
+
 void CGXGridCore::Data::addRows(ROWCOL row, ROWCOL count) {
     cells.insertRows(row, count);
+    followAddedRows(row, count);
+}
+
+void CGXGridCore::Data::putRows(ROWCOL row, kota::grid::TakenLines lines) {
+    const ROWCOL count = lines.count();
+    cells.putRows(row, std::move(lines));
+    followAddedRows(row, count);
+}
+
+void CGXGridCore::Data::followAddedRows(ROWCOL row, ROWCOL count) {
+    remember(kota::grid::LinesCame{row, count}, {row, 0});
     kota::grid::shiftForInsertedRows(covered, row, count);
     changeSelection(
         [=](std::vector<CGXRange>& ranges) { kota::grid::shiftForInsertedRows(ranges, row, count); });
@@ -93,7 +117,7 @@ void CGXGridCore::Data::takeRows(ROWCOL first, ROWCOL last) {
     const auto follow = [=](ROWCOL row) {
         return row < first ? row : row > last ? row - (last - first + 1) : 0;
     };
-    cells.removeRows(first, last);
+    remember(kota::grid::LinesWent{first, cells.takeRows(first, last)}, {first, 0});
     kota::grid::shiftForRemovedRows(covered, first, last);
     changeSelection(
         [=](std::vector<CGXRange>& ranges) { kota::grid::shiftForRemovedRows(ranges, first, last); });

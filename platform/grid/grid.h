@@ -155,6 +155,15 @@ public:
     // Ends the edit and takes back the text that the user typed; OnModifyCell is called once more then, with
     // the text from before.
     void CancelEdit();
+    // What the user did, gesture by gesture, where GetParam()->EnableUndo allows it. A gesture is an edit
+    // from its first key to its commit, a click, a command, with all that followed from it. An undo ends as
+    // an edit does: OnModifyCell is called for each cell, and the virtual SetCurrentCell for the place where
+    // the gesture began. A text that is being typed is undone before all else. Changes while undo is not
+    // enabled make the grid forget its gestures. 0 when there is nothing to be undone.
+    bool CanUndo() const;
+    bool CanRedo() const;
+    BOOL Undo();
+    BOOL Redo();
     void SetWarningText(const char* text);
     // The last refusal; its text is empty when the edit has gone on since.
     const kota::GridWarning& Warning() const;
@@ -169,12 +178,19 @@ public:
     kota::GridChanges TakeChanges();
 
     // Keys that the user pressed in the grid. 1: taken. The base moves the current cell by the arrow keys,
-    // Page Up and Down, Home and End, takes Escape while a cell is edited, and begins an edit by F2.
+    // Page Up and Down, Home and End, and extends the selection from it where Shift is held. It selects the
+    // line by Shift and the space bar, all cells by Ctrl+A; begins an edit by F2 and cancels it by Escape;
+    // and redoes by Ctrl+Y and Ctrl+Shift+Z.
     virtual BOOL ProcessKeys(CWnd* window, UINT message, UINT key, UINT repeat, UINT flags);
     // Before a cell is edited; 0 refuses.
     virtual BOOL OnStartEditing(ROWCOL row, ROWCOL col);
-    // After every change of the text of the cell being edited, and after a click changed a check box.
+    // After every change of the text of the cell being edited, after a click changed a check box, and after
+    // an undo changed a cell.
     virtual void OnModifyCell(ROWCOL row, ROWCOL col);
+    // Adds a line at the end for values that are pasted beyond it. 0 when that could not be.
+    virtual BOOL AppendLine();
+    // Takes away the lines that are selected as a whole, when they are cut.
+    virtual void DeleteSelection();
     // The focus has come to the grid or left it.
     virtual void OnActivateGrid(BOOL active);
     // A check box was clicked; its stored value is the new one.
@@ -184,6 +200,8 @@ public:
 
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
     bool LetFocusGo() override;
+    // The commands of the Edit menu.
+    BOOL OnCmdMsg(UINT id, int notification) override;
 
 private:
     friend class kota::grid::User;

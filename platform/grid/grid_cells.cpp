@@ -21,9 +21,30 @@ CGXRange CGXGridCore::Data::existing(const CGXRange& range) const {
 bool CGXGridCore::Data::storeValue(ROWCOL row, ROWCOL col, std::string_view text) {
     if (!cells.exists(row, col))
         return false;
-    cells.setValue(row, col, text);
+    if (!param.IsUndoEnabled()) {
+        journal.forget();
+        cells.setValue(row, col, text);
+    } else if (!cells.holds(row, col, text)) {
+        exchange({row, col}, {kota::grid::SmallText(text), cells.cellStyle(row, col)});
+    }
     noteCells(row, col, row, col);
     return true;
+}
+
+void CGXGridCore::Data::layOverCell(CellPlace place, const CGXStyle& style, ReadOnlyLock lock) {
+    if (style.HasValue())
+        storeValue(place.row, place.col, style.ValueText());
+    kota::grid::CellContent before = cells.content(place.row, place.col);
+    cells.layOverCell(place.row, place.col, style, lock);
+    if (cells.cellStyle(place.row, place.col) != before.style)
+        remember(kota::grid::CellWas{place, std::move(before)}, place);
+}
+
+void CGXGridCore::Data::layOverRow(ROWCOL row, const CGXStyle& style, ReadOnlyLock lock) {
+    const kota::grid::StyleId before = cells.rowStyle(row);
+    cells.layOverRow(row, style, lock);
+    if (cells.rowStyle(row) != before)
+        remember(kota::grid::LineStyleWas{row, before}, {row, 0});
 }
 
 BOOL CGXGridCore::SetStyleRange(const CGXRange& range, const CGXStyle& style) {
@@ -44,11 +65,11 @@ BOOL CGXGridCore::SetStyleRange(const CGXRange& range, const CGXStyle& style) {
             cells.layOverCol(col, style, lock);
     else if (wholeRows)
         for (ROWCOL row = range.top; row <= lastRow; ++row)
-            cells.layOverRow(row, style, lock);
+            data_->layOverRow(row, style, lock);
     else
         for (ROWCOL row = range.top; row <= lastRow; ++row)
             for (ROWCOL col = firstCol; col <= lastCol; ++col)
-                cells.layOverCell(row, col, style, lock);
+                data_->layOverCell({row, col}, style, lock);
     data_->noteRange(range);
     return TRUE;
 }

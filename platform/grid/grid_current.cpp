@@ -4,6 +4,7 @@
 #include <array>
 #include <cstdint>
 #include <limits>
+#include <optional>
 
 using kota::grid::CellPlace;
 
@@ -67,32 +68,55 @@ BOOL CGXGridCore::SetCurrentCell(ROWCOL row, ROWCOL col, UINT flags) {
     return TRUE;
 }
 
-BOOL CGXGridCore::MoveCurrentCell(int direction, int count, BOOL /*update*/) {
-    const CellPlace first{GetHeaderRows() + 1, GetHeaderCols() + 1};
-    const CellPlace last{GetRowCount(), GetColCount()};
+std::optional<CellPlace> CGXGridCore::Data::placeBeside(CellPlace start, int direction, int count) const {
+    const CellPlace first{rowBand.headers + 1, colBand.headers + 1};
+    const CellPlace last{cells.rows(), cells.cols()};
     if (direction < GX_UP || direction > GX_TOPLEFT || count < 1 || first.row > last.row ||
         first.col > last.col)
-        return FALSE;
+        return std::nullopt;
     const auto [rowStep, colStep, reach] = directions[static_cast<std::size_t>(direction - 1)];
-    const std::int64_t page = std::int64_t{data_->pageRows} * count;
+    const std::int64_t page = std::int64_t{pageRows} * count;
     const std::int64_t distance = reach == Reach::Steps ? count : reach == Reach::Pages ? page : allTheWay;
-    const CellPlace from = data_->current.isNone() ? first : data_->current;
-    const CGXRange here = GetCoveredCellsRowCol(from.row, from.col);
+    const CellPlace from = start.isNone() ? first : start;
+    const CGXRange here = grid.GetCoveredCellsRowCol(from.row, from.col);
     CellPlace to{moved(from.row, here.top, here.bottom, rowStep * distance, first.row, last.row),
                  moved(from.col, here.left, here.right, colStep * distance, first.col, last.col)};
     // A step goes on past cells that are not enabled, a jump comes back to the first that is.
     const std::int64_t back = reach == Reach::Steps ? 1 : -1;
-    while (!data_->isEnabled(to)) {
+    while (!isEnabled(to)) {
         const CellPlace next{moved(to.row, to.row, to.row, back * rowStep, first.row, last.row),
                              moved(to.col, to.col, to.col, back * colStep, first.col, last.col)};
         if (next == to)
-            return FALSE;
+            return std::nullopt;
         to = next;
     }
-    const CGXRange target = GetCoveredCellsRowCol(to.row, to.col);
-    if (data_->current == CellPlace{target.top, target.left})
-        return FALSE;
-    return SetCurrentCell(target.top, target.left, GX_SCROLLINVIEW | GX_DISPLAYEDITWND);
+    const CGXRange target = grid.GetCoveredCellsRowCol(to.row, to.col);
+    const CellPlace place{target.top, target.left};
+    return place == start ? std::nullopt : std::optional(place);
+}
+
+BOOL CGXGridCore::MoveCurrentCell(int direction, int count, BOOL /*update*/) {
+    const auto place = data_->placeBeside(data_->current, direction, count);
+    return place && SetCurrentCell(place->row, place->col, GX_SCROLLINVIEW | GX_DISPLAYEDITWND);
+}
+
+// The current cell is one corner of what is selected; the other one moves.
+void CGXGridCore::Data::extendSelection(int direction) {
+    const std::vector<CGXRange>& selected = param.GetRangeList()->Ranges();
+    const bool wholeLines = hasWholeLines();
+    CellPlace corner = current;
+    if (selected.size() == 1) {
+        const CGXRange range = existing(selected.front());
+        corner.row = range.top == current.row ? range.bottom : range.top;
+        if (!wholeLines)
+            corner.col = range.left == current.col ? range.right : range.left;
+    }
+    const auto moved = placeBeside(corner, direction, 1);
+    if (!moved || current.isNone())
+        return;
+    const auto [top, bottom] = std::minmax(current.row, moved->row);
+    const auto [left, right] = std::minmax(current.col, moved->col);
+    select({wholeLines ? CGXRange().SetRows(top, bottom) : CGXRange(top, left, bottom, right)});
 }
 
 bool CGXGridCore::LetFocusGo() {

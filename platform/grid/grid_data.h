@@ -2,27 +2,29 @@
 
 #include "platform/grid/cell_store.h"
 #include "platform/grid/grid.h"
+#include "platform/grid/journal.h"
+#include "platform/grid/table_text.h"
 
 #include <map>
 #include <memory>
+#include <optional>
+#include <string>
 #include <vector>
 
 namespace kota::grid {
-
-struct CellPlace {
-    ROWCOL row = 0;
-    ROWCOL col = 0;
-
-    bool isNone() const { return row == 0 && col == 0; }
-    friend bool operator==(const CellPlace&, const CellPlace&) = default;
-};
 
 // The edit of a cell. It stays with its line when lines come and go, and ends with it.
 struct Edit {
     CGXControl* control = nullptr; // null when no cell is being edited
     CellPlace place;
+    unsigned gesture = 0;          // of which it is part
     CString textBefore;            // as it was loaded
     bool changedWhileOpen = false; // the text changed while the list of entries stood open
+};
+
+struct EndedEdit {
+    unsigned turn = 0;
+    unsigned gesture = 0;
 };
 
 // The lines (columns) that stay in view, and those of them that are headers.
@@ -44,8 +46,39 @@ struct CGXGridCore::Data {
 
     // All stored values of cells are written here. False beyond the counts.
     bool storeValue(ROWCOL row, ROWCOL col, std::string_view text);
+    void layOverCell(CellPlace place, const CGXStyle& style, kota::grid::ReadOnlyLock lock);
+    void layOverRow(ROWCOL row, const CGXStyle& style, kota::grid::ReadOnlyLock lock);
     void addRows(ROWCOL row, ROWCOL count);
+    void putRows(ROWCOL row, kota::grid::TakenLines lines);
+    void followAddedRows(ROWCOL row, ROWCOL count);
     void takeRows(ROWCOL first, ROWCOL last);
+
+    // The gesture of which a change is part that is made now.
+    unsigned gesture() const;
+    // Each change of cells and lines is remembered, by what takes it back.
+    void remember(kota::grid::Change change, CellPlace place);
+    // Gives a cell what it is to hold of its own.
+    void exchange(CellPlace place, kota::grid::CellContent content);
+    void takeBack(kota::grid::Change change);
+    bool canReplay(kota::grid::Replay which) const;
+    bool replay(kota::grid::Replay which);
+    void commitAt(CellPlace place);
+
+    // The place that a key in this direction leads to; none where it leads nowhere else.
+    std::optional<CellPlace> placeBeside(CellPlace start, int direction, int count) const;
+    void extendSelection(int direction);
+    CGXRange target() const;
+    bool hasWholeLines() const;
+    std::string copyOf(CellPlace place) const;
+    bool copy() const;
+    bool cut();
+    bool paste(std::vector<kota::grid::TableLine> lines);
+    bool pasteCell(CellPlace place, const std::string& text, CString& reason);
+    bool put(CellPlace place, const std::string& text, CString& reason);
+    bool putText(CellPlace place, const std::string& text, CString& reason);
+    // Cuts, copies or pastes; `asked` only tells whether that can be.
+    bool editCommand(UINT id, bool asked);
+
     // The screen is told if that changed anything.
     template <class Change>
     void changeSelection(Change change) {
@@ -73,6 +106,7 @@ struct CGXGridCore::Data {
     bool isCurrentCheckBox() const;
     // Changes a check box of the current cell. False when that may not be.
     bool toggle();
+    void check(CellPlace place, bool checked);
 
     void tell();
     void noteCells(ROWCOL top, ROWCOL left, ROWCOL bottom, ROWCOL right);
@@ -85,6 +119,7 @@ struct CGXGridCore::Data {
     CGXGridCore& grid;
     CGXGridParam param;
     kota::grid::CellStore cells;
+    kota::grid::Journal journal;
     std::map<UINT, std::unique_ptr<CGXControl>> controls;
     std::vector<std::unique_ptr<CGXControl>> replacedControls; // one of them may still be running
     std::vector<CGXRange> covered;
@@ -97,6 +132,7 @@ struct CGXGridCore::Data {
 
     CellPlace current;
     kota::grid::Edit edit;
+    kota::grid::EndedEdit lastEdit;
     unsigned edits = 0; // how many edits began or ended: another count is another edit
     bool validating = false;
     CString warningText;

@@ -1,5 +1,6 @@
 #include "platform/framework/number_text.h"
 #include "platform/framework/scope.h"
+#include "platform/framework/turn.h"
 #include "platform/grid/grid_data.h"
 
 bool CGXGridCore::IsEditing() const {
@@ -60,7 +61,10 @@ void CGXGridCore::Data::openEdit(CellPlace place) {
     CGXControl* const control = grid.GetControl(place.row, place.col);
     control->Init(place.row, place.col);
     control->SetModify(false);
-    edit = {.control = control, .place = place, .textBefore = control->GetCurrentText()};
+    edit = {.control = control,
+            .place = place,
+            .gesture = kota::turnNumber(),
+            .textBefore = control->GetCurrentText()};
     ++edits;
     note(&kota::GridChanges::editing);
 }
@@ -69,6 +73,7 @@ void CGXGridCore::Data::endEdit() {
     edit.control->SetModify(false);
     edit.control->SetDroppedDown(false);
     noteCells(edit.place.row, edit.place.col, edit.place.row, edit.place.col);
+    lastEdit = {kota::turnNumber(), edit.gesture};
     edit = {};
     ++edits;
     warning.text.Empty();
@@ -121,6 +126,7 @@ bool CGXGridCore::Data::commitEdit() {
         if (!valid && control->GetModify()) {
             warning = {edit.place.row, edit.place.col, warningText};
             note(&kota::GridChanges::warned);
+            note(&kota::GridChanges::scroll);
             return false;
         }
         hasValue = control->GetModify() && control->GetValue(value);
@@ -142,11 +148,14 @@ bool CGXGridCore::Data::toggle() {
     const CellPlace place = current;
     if (!canChange(place) || !isCurrentCheckBox())
         return false;
-    const bool checked = kota::textToInt(cells.text(place.row, place.col)) != 0;
-    storeValue(place.row, place.col, checked ? "0" : "1");
+    check(place, kota::textToInt(cells.text(place.row, place.col)) == 0);
+    return true;
+}
+
+void CGXGridCore::Data::check(CellPlace place, bool checked) {
+    storeValue(place.row, place.col, checked ? "1" : "0");
     const HWND window = grid.GetSafeHwnd();
     grid.OnModifyCell(place.row, place.col);
     if (grid.GetSafeHwnd() == window && cells.exists(place.row, place.col))
         grid.OnClickedButtonRowCol(place.row, place.col);
-    return true;
 }

@@ -1,5 +1,6 @@
 #include "platform/framework/messages.h"
 #include "platform/grid/grid_data.h"
+#include "platform/grid/user.h"
 
 #include <array>
 
@@ -27,13 +28,25 @@ constexpr std::array<Key, 8> movingKeys = {{
 BOOL CGXGridCore::ProcessKeys(CWnd* /*window*/, UINT message, UINT key, UINT /*repeat*/, UINT /*flags*/) {
     if (message != WM_KEYDOWN)
         return FALSE;
+    const bool control = GetKeyState(VK_CONTROL) < 0;
+    const bool shift = GetKeyState(VK_SHIFT) < 0;
     for (const Key& moving : movingKeys)
         if (moving.key == key) {
-            MoveCurrentCell(GetKeyState(VK_CONTROL) < 0 ? moving.withControl : moving.direction);
+            const int direction = control ? moving.withControl : moving.direction;
+            if (shift && !IsEditing())
+                data_->extendSelection(direction);
+            else
+                MoveCurrentCell(direction);
             return TRUE;
         }
     if (key == VK_F2)
         return data_->beginEdit();
+    if (key == VK_SPACE && shift)
+        return kota::grid::clickLineHeader(*this, data_->current.row);
+    if (key == 'A' && control && !IsEditing())
+        return kota::grid::selectCells(*this, CGXRange(1, 1, GetRowCount(), GetColCount()));
+    if (control && (key == 'Y' || (key == 'Z' && shift)))
+        return Redo();
     if (key != VK_ESCAPE || !IsEditing())
         return FALSE;
     CancelEdit();
@@ -59,6 +72,22 @@ LRESULT CGXGridCore::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
         return DefWindowProc(message, wParam, lParam);
     default:
         return CWnd::WindowProc(message, wParam, lParam);
+    }
+}
+
+BOOL CGXGridCore::OnCmdMsg(UINT id, int notification) {
+    const bool asked = notification == CN_UPDATE_COMMAND_UI;
+    if (notification != 0 && !asked)
+        return CWnd::OnCmdMsg(id, notification);
+    switch (id) {
+    case ID_EDIT_UNDO:
+        return asked ? CanUndo() : Undo();
+    case ID_EDIT_CUT:
+    case ID_EDIT_COPY:
+    case ID_EDIT_PASTE:
+        return data_->editCommand(id, asked);
+    default:
+        return CWnd::OnCmdMsg(id, notification);
     }
 }
 

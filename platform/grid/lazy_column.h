@@ -24,6 +24,21 @@ public:
         return lines_[line];
     }
 
+    // Takes the values of the lines `first` to `last`, with which they go.
+    LazyColumn take(std::size_t first, std::size_t last) {
+        LazyColumn taken;
+        const std::size_t end = std::min(last + 1, lines_.size());
+        for (std::size_t line = first; line < end; ++line)
+            taken.lines_.push_back(std::move(lines_[line]));
+        erase(first, last);
+        return taken;
+    }
+    // Gives lines that were never written values, from `line` on.
+    void put(std::size_t line, LazyColumn values, std::size_t lines) {
+        for (T& value : values.lines_)
+            write(line++, lines) = std::move(value);
+    }
+
     void insert(std::size_t line, std::size_t count) {
         if (line >= lines_.size())
             return;

@@ -18,7 +18,7 @@ private:
 // What holds for a grid as a whole.
 class KOTA_API CGXGridParam {
 public:
-    // Whether changes can be undone; off while a page builds its grid.
+    // Whether changes can be undone; off while a page builds or fills its grid.
     void EnableUndo(BOOL enable) { undo_ = enable != 0; }
     bool IsUndoEnabled() const { return undo_; }
     // While the lock is on, which it is from the start, a read-only cell keeps its style and takes no input.
