@@ -10,6 +10,7 @@ class CKota0_adView;
 
 // What the plug-in does for sibling editors, as static operations; no instance of the class does any work.
 // Without a view, `path` is opened. Of a list of items the first one counts, and the list stays the caller's.
+// Null or 0 is the result when an allocation failed, here and of the functions below.
 class KOTA0_AD_API CKota0_ad : public CWnd {
     DECLARE_DYNAMIC(CKota0_ad)
 public:

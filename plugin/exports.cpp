@@ -1,5 +1,5 @@
-#include "exchange/operations.h"
 #include "plugin/Kota0_ad.h"
+#include "plugin/entry_point.h"
 #include "resources/ids.h"
 #include "resources/module.h"
 
@@ -20,8 +20,10 @@ int KhGetNumToolbars() {
 CKhToolBarEx* KhCreateToolbar(CKhMDIFrameWnd* frame, unsigned style, unsigned id, int index) {
     if (index != 0)
         return nullptr;
-    auto toolBar = std::make_unique<CKhToolBarEx>();
-    return CKota0_ad::InitToolBar(toolBar.get(), frame, style, id) ? toolBar.release() : nullptr;
+    return orZero([&]() -> CKhToolBarEx* {
+        auto toolBar = std::make_unique<CKhToolBarEx>();
+        return CKota0_ad::InitToolBar(toolBar.get(), frame, style, id) ? toolBar.release() : nullptr;
+    });
 }
 
 int KhInitToolbar(CKhToolBarEx* toolBar, CKhMDIFrameWnd* frame, unsigned style, unsigned id, unsigned index) {
@@ -32,29 +34,34 @@ unsigned KhGetBitmapId() {
     return MenuId::EditorBitmap;
 }
 
+namespace {
+
+int load(UINT id, CString& out) {
+    return orZero([&] {
+        out = kota0AdModule().string(id);
+        return 1;
+    });
+}
+
+} // namespace
+
 int KhGetEditorString(CString* out) {
-    if (!out)
-        return 0;
-    *out = kota0AdModule().string(StringId::EditorName);
-    return 1;
+    return out ? load(StringId::EditorName, *out) : 0;
 }
 
 int KhGetToolbarString(CString* out, int index) {
-    if (!out || index != 0)
-        return 0;
-    *out = kota0AdModule().string(StringId::ToolbarName);
-    return 1;
+    return out && index == 0 ? load(StringId::ToolbarName, *out) : 0;
 }
 
 CObList* K31MSGGetData(CString path, CKota0_adView* view) {
-    return exchange::GetData(std::move(path), view);
+    return CKota0_ad::GetData(std::move(path), view);
 }
 void K31MSGInsertData(CString path, CKota0_adView* view, CObList* items) {
-    exchange::InsertData(std::move(path), view, items);
+    CKota0_ad::InsertData(std::move(path), view, items);
 }
 void K31MSGDeleteData(CString path, CKota0_adView* view, CObList* items) {
-    exchange::DeleteData(std::move(path), view, items);
+    CKota0_ad::DeleteData(std::move(path), view, items);
 }
 void K31MSGSelectData(CString path, CKota0_adView* view, CObList* items) {
-    exchange::SelectData(std::move(path), view, items);
+    CKota0_ad::SelectData(std::move(path), view, items);
 }

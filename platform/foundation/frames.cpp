@@ -1,5 +1,6 @@
 #include "platform/foundation/frames.h"
 
+#include "platform/framework/document.h"
 #include "platform/framework/template.h"
 #include "platform/framework/turn.h"
 
@@ -55,8 +56,27 @@ void append(CMenu& bar, const kota::MenuPopupTemplate& popup) {
     }
 }
 
-bool hasPopup(const kota::MenuTemplate& menu, std::string_view text) {
-    return std::ranges::find(menu.popups, text, &kota::MenuPopupTemplate::text) != menu.popups.end();
+// Whether two menus are the same one. Their captions may be in different languages, so that their commands
+// tell, where the shell's has any.
+bool isSame(const kota::MenuPopupTemplate& own, const kota::MenuPopupTemplate& documents) {
+    if (own.items.empty())
+        return std::string_view(own.text) == documents.text;
+    return std::ranges::any_of(own.items, [&](const kota::MenuItemTemplate& item) {
+        return item.id != 0 && std::ranges::find(documents.items, item.id, &kota::MenuItemTemplate::id) !=
+                                   documents.items.end();
+    });
+}
+
+bool hasPopup(const kota::MenuTemplate& menu, const kota::MenuPopupTemplate& documents) {
+    return std::ranges::any_of(menu.popups,
+                               [&](const kota::MenuPopupTemplate& own) { return isSame(own, documents); });
+}
+
+const kota::Module* moduleInFront(const CMDIFrameWnd& frame) {
+    const CMDIChildWnd* const child = frame.MDIGetActive();
+    const CDocument* const document = child ? child->GetActiveDocument() : nullptr;
+    const CDocTemplate* const docTemplate = document ? document->GetDocTemplate() : nullptr;
+    return docTemplate ? &docTemplate->Module() : nullptr;
 }
 
 } // namespace
@@ -75,8 +95,17 @@ void CKhMDIFrameWnd::OnUpdateFrameMenu(const CDocTemplate* front) {
     for (std::size_t i = 0; i < own_->popups.size(); ++i) {
         if (i == documentsPlace && documents)
             for (const kota::MenuPopupTemplate& popup : documents->popups)
-                if (!hasPopup(*own_, popup.text))
+                if (!hasPopup(*own_, popup))
                     append(bar, popup);
         append(bar, own_->popups[i]);
+    }
+}
+
+void CKhMDIFrameWnd::ShowToolBar(UINT command, bool show) {
+    const kota::Module* const front = moduleInFront(*this);
+    for (CControlBar* bar : DockedBars()) {
+        const auto* const toolBar = dynamic_cast<const CKhFlatToolBar*>(bar);
+        if (toolBar && toolBar->HasCommand(command) && (!show || toolBar->ResourceModule() == front))
+            bar->ShowWindow(show);
     }
 }

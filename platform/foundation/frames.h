@@ -34,7 +34,7 @@ private:
 };
 
 // The shell's main window. Its menu bar holds the menus of the shell, and the document in front adds its own
-// behind the second one: those that the shell has none of the same name for.
+// behind the second one: those that share no command with a menu of the shell.
 class KOTA_API CKhMDIFrameWnd : public SECMDIFrameWnd {
     DECLARE_DYNAMIC(CKhMDIFrameWnd)
 public:
@@ -43,6 +43,9 @@ public:
 
     // The shell's own menu, which must outlive the window.
     void LoadMenu(const kota::MenuTemplate& own);
+    // As an editor asks that knows a tool bar by a command: hides the docked bars with that command, or shows
+    // the one among them that belongs to the document in front.
+    void ShowToolBar(UINT command, bool show);
 
 protected:
     void OnUpdateFrameMenu(const CDocTemplate* front) override;

@@ -5,58 +5,58 @@
 #include <dlfcn.h>
 
 #include <algorithm>
-#include <memory>
 #include <string>
 #include <utility>
 #include <vector>
 
 namespace kota {
 
-class Library {
-public:
-    explicit Library(void* handle) : handle_(handle) {
-        if (const auto tables = reinterpret_cast<const Resources* (*)()>(symbol("KotaResources")))
-            resources_ = tables();
-    }
-    ~Library() { dlclose(handle_); }
-    Library(const Library&) = delete;
-    Library& operator=(const Library&) = delete;
-
-    void* symbol(const char* name) const { return dlsym(handle_, name); }
-    const Resources* resources() const { return resources_; }
-
-private:
-    void* handle_;
-    const Resources* resources_ = nullptr;
-};
-
 namespace {
 
-std::vector<std::unique_ptr<Library>>& loadedLibraries() {
-    static std::vector<std::unique_ptr<Library>> libraries;
-    return libraries;
+// One load of a library.
+struct Load {
+    HINSTANCE library;
+    const Resources* resources;
+};
+
+std::vector<Load>& loads() {
+    static std::vector<Load> all;
+    return all;
 }
 
 } // namespace
 
 HINSTANCE loadLibrary(const char* path, const char** problem) {
     static std::string reason;
-    void* const handle = dlopen(path, RTLD_NOW | RTLD_LOCAL);
-    if (!handle) {
+    const auto library = static_cast<HINSTANCE>(dlopen(path, RTLD_NOW | RTLD_LOCAL));
+    if (!library) {
         reason = dlerror();
         if (problem)
             *problem = reason.c_str();
         return nullptr;
     }
-    return loadedLibraries().emplace_back(std::make_unique<Library>(handle)).get();
+    const auto tables = reinterpret_cast<const Resources* (*)()>(symbolOf(library, "KotaResources"));
+    loads().push_back({library, tables ? tables() : nullptr});
+    return library;
+}
+
+HINSTANCE libraryAt(const void* address) {
+    Dl_info found{};
+    void* const library =
+        dladdr(address, &found) != 0 ? dlopen(found.dli_fname, RTLD_NOW | RTLD_NOLOAD) : nullptr;
+    if (library)
+        dlclose(library); // whoever loaded it holds it
+    return static_cast<HINSTANCE>(library);
 }
 
 void* symbolOf(HINSTANCE library, const char* name) {
-    return library ? library->symbol(name) : nullptr;
+    void* const symbol = library ? dlsym(library, name) : nullptr;
+    return symbol && libraryAt(symbol) == library ? symbol : nullptr; // it may be that of a library it needs
 }
 
 const Resources* resourcesOf(HINSTANCE library) {
-    return library ? library->resources() : nullptr;
+    const auto found = std::ranges::find(loads(), library, &Load::library);
+    return found == loads().end() ? nullptr : found->resources;
 }
 
 } // namespace kota
@@ -88,13 +88,12 @@ BOOL AfxInitExtensionModule(AFX_EXTENSION_MODULE& record, HINSTANCE library) {
 }
 
 BOOL FreeLibrary(HINSTANCE library) {
-    auto& loaded = kota::loadedLibraries();
-    const auto found = std::ranges::find(loaded, library, &std::unique_ptr<kota::Library>::get);
-    if (found == loaded.end())
+    auto& loads = kota::loads();
+    const auto found = std::ranges::find(loads, library, &kota::Load::library);
+    if (found == loads.end())
         return FALSE;
-    // What is unloaded may free a library itself.
-    const std::unique_ptr<kota::Library> freed = std::move(*found);
-    loaded.erase(found);
+    loads.erase(found); // first: what is unloaded may free a library itself
+    dlclose(library);
     return TRUE;
 }
 

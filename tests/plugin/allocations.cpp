@@ -7,6 +7,16 @@ namespace {
 
 int made = 0;
 int held = 0;
+int toSpare = 0;
+int toFail = 0;
+
+bool failsNow() {
+    if (toFail == 0 || toSpare-- > 0)
+        return false;
+    toSpare = 0;
+    --toFail;
+    return true;
+}
 
 void giveBack(void* memory) {
     if (memory)
@@ -23,8 +33,19 @@ int kota::test::allocationsHeld() {
     return held;
 }
 
+kota::test::FailingAllocations::FailingAllocations(int spared, int times) {
+    toSpare = spared;
+    toFail = times;
+}
+kota::test::FailingAllocations::~FailingAllocations() {
+    toFail = 0;
+}
+bool kota::test::FailingAllocations::done() const {
+    return toFail == 0;
+}
+
 void* operator new(std::size_t size) {
-    void* const memory = std::malloc(size == 0 ? 1 : size);
+    void* const memory = failsNow() ? nullptr : std::malloc(size == 0 ? 1 : size);
     if (!memory)
         throw std::bad_alloc();
     ++made;

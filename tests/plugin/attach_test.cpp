@@ -1,4 +1,5 @@
 #include "tests/plugin/second_library.h"
+#include "tests/support/temp_folder.h"
 
 using namespace kota::test;
 
@@ -29,6 +30,7 @@ TEST(AnExtensionModule, HasNoLibraryOfTextsBeforeOneIsLoaded) {
 
 TEST(AnExtensionModule, OfALoadedPlugInIsInitialised) {
     EXPECT_TRUE(secondRecord().initialised);
+    EXPECT_EQ(secondRecord().library, secondPlugIn());
     EXPECT_EQ(AfxInitExtensionModule(secondRecord(), nullptr), 0);
 }
 
@@ -96,12 +98,21 @@ TEST(ALanguageLibrary, IsThatOfTheUsersLanguage) {
     EXPECT_EQ(stored, nullptr);
 }
 
-TEST(FreeingALibrary, GivesZeroForNull) {
+// A library that nobody else has loaded.
+class FreeingALibrary : public testing::Test {
+protected:
+    FreeingALibrary() { std::filesystem::copy_file(KOTA_SECOND_LANGUAGE, path); }
+
+    TempFolder folder;
+    const std::string path = folder.file("copy.so");
+};
+
+TEST_F(FreeingALibrary, GivesZeroForNull) {
     EXPECT_EQ(FreeLibrary(nullptr), 0);
 }
 
-TEST(FreeingALibrary, GivesZeroForAHandleGivenBackAlready) {
-    const HINSTANCE library = kota::loadLibrary(KOTA_SECOND_LANGUAGE);
+TEST_F(FreeingALibrary, GivesZeroWhenItIsGivenBackAlready) {
+    const HINSTANCE library = kota::loadLibrary(path.c_str());
     ASSERT_NE(library, nullptr);
 
     EXPECT_EQ(FreeLibrary(library), 1);
@@ -109,16 +120,17 @@ TEST(FreeingALibrary, GivesZeroForAHandleGivenBackAlready) {
     EXPECT_EQ(FreeLibrary(library), 0);
 }
 
-TEST(FreeingALibrary, LeavesItToThoseWhoLoadedItAgain) {
-    const HINSTANCE first = kota::loadLibrary(KOTA_SECOND_LANGUAGE);
-    const HINSTANCE second = kota::loadLibrary(KOTA_SECOND_LANGUAGE);
-    ASSERT_TRUE(first && second);
+TEST_F(FreeingALibrary, LeavesItToThoseWhoLoadedItAgain) {
+    const HINSTANCE library = kota::loadLibrary(path.c_str());
+    ASSERT_NE(library, nullptr);
+    EXPECT_EQ(kota::loadLibrary(path.c_str()), library);
 
-    EXPECT_EQ(FreeLibrary(first), 1);
+    EXPECT_EQ(FreeLibrary(library), 1);
 
-    EXPECT_NE(kota::resourcesOf(second), nullptr);
-    EXPECT_NE(kota::symbolOf(second, "KotaResources"), nullptr);
-    EXPECT_EQ(FreeLibrary(second), 1);
+    EXPECT_NE(kota::resourcesOf(library), nullptr);
+    EXPECT_NE(kota::symbolOf(library, "KotaResources"), nullptr);
+    EXPECT_EQ(FreeLibrary(library), 1);
+    EXPECT_EQ(FreeLibrary(library), 0);
 }
 
 TEST(LoadingALibrary, TellsWhyItFailed) {
@@ -128,6 +140,15 @@ TEST(LoadingALibrary, TellsWhyItFailed) {
 
     ASSERT_NE(problem, nullptr);
     EXPECT_NE(std::string(problem).find("/no/such/library.so"), std::string::npos);
+}
+
+TEST(LoadingALibrary, MakesItTheOneThatItsAddressesLieIn) {
+    void* const address = kota::symbolOf(plugIn(), "KhGetBitmapId");
+    ASSERT_NE(address, nullptr);
+
+    EXPECT_EQ(kota::libraryAt(address), plugIn());
+    EXPECT_EQ(kota::libraryAt(&secondRecord()), secondPlugIn());
+    EXPECT_EQ(kota::libraryAt(nullptr), nullptr);
 }
 
 TEST(LoadingALibrary, FindsNoTablesWhereThereAreNone) {

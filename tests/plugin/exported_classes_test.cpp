@@ -1,4 +1,5 @@
 #include "plugin/Kota0_ad.h"
+#include "tests/plugin/failing_buttons.h"
 #include "tests/plugin/plug_in.h"
 #include "tests/support/owned.h"
 
@@ -91,6 +92,18 @@ TEST(TheNamespaceOfThePlugIn, SetsUpAToolBarAsTheExportDoes) {
     EXPECT_EQ(bar.DockingSides(), 0xF000U);
     EXPECT_EQ(frame.DockingSides(), 0xF000U);
     EXPECT_EQ(frame.DockedBars(), std::vector<CControlBar*>{&bar});
+}
+
+TEST(TheNamespaceOfThePlugIn, LeavesAToolBarWithoutButtonsItsWindow) {
+    CKhMDIFrameWnd frame;
+    frame.Create();
+    CKhToolBarEx bar;
+    const FailingButtons failing;
+
+    EXPECT_EQ(CKota0_ad::InitToolBar(&bar, &frame, 0, 59407), 0);
+
+    EXPECT_EQ(bar.GetParent(), &frame);
+    EXPECT_TRUE(frame.DockedBars().empty());
 }
 
 TEST(TheNamespaceOfThePlugIn, LeavesAToolBarThatCannotBeCreated) {

@@ -116,7 +116,7 @@ public:
     std::vector<WPARAM> reached;
 };
 
-TEST_F(Keys, GoOnToTheWindowWhenNobodyHandlesTheirCommand) {
+TEST_F(Keys, GoNoFurtherWhenNobodyHandlesTheirCommand) {
     Noting window(viewOf(create()));
     ASSERT_FALSE(kota::input::canCommand(57600));
     ASSERT_FALSE(kota::input::canCommand(57601));
@@ -124,7 +124,9 @@ TEST_F(Keys, GoOnToTheWindowWhenNobodyHandlesTheirCommand) {
     kota::input::key('N', {.control = true});
     kota::input::key('O', {.control = true});
 
-    EXPECT_THAT(window.reached, ElementsAre(WPARAM{'N'}, WPARAM{'O'}));
+    kota::input::key(VK_DELETE, {.shift = true});
+
+    EXPECT_THAT(window.reached, IsEmpty());
 }
 
 TEST_F(Keys, GoNoFurtherWhenTheirCommandWasRun) {
@@ -135,15 +137,23 @@ TEST_F(Keys, GoNoFurtherWhenTheirCommandWasRun) {
     EXPECT_THAT(window.reached, IsEmpty());
 }
 
-TEST_F(Keys, GoOnToTheWindowWhenTheirCommandIsGreyed) {
+TEST_F(Keys, GoNoFurtherWhenTheirCommandIsGreyed) {
     CKota0_adDoc& document = createChanged();
     Noting window(viewOf(document));
     shell().GetMenu()->EnableMenuItem(ID_FILE_SAVE, MF_BYCOMMAND | MF_GRAYED);
 
     kota::input::key('S', {.control = true});
 
-    EXPECT_THAT(window.reached, ElementsAre(WPARAM{'S'}));
+    EXPECT_THAT(window.reached, IsEmpty());
     EXPECT_TRUE(document.IsModified());
+}
+
+TEST_F(Keys, GoToTheWindowWhenTheyAreNone) {
+    Noting window(viewOf(create()));
+
+    kota::input::key('K', {.control = true});
+
+    EXPECT_THAT(window.reached, ElementsAre(WPARAM{'K'}));
 }
 
 constexpr kota::Accelerator ownKeys[] = {

@@ -1,5 +1,6 @@
 #include "platform/foundation/plug_in.h"
 #include "platform/framework/input.h"
+#include "platform/framework/messages.h"
 #include "platform/framework/turn.h"
 #include "resources/ids.h"
 #include "tests/plugin/second/ids.h"
@@ -14,12 +15,25 @@ namespace {
 
 using testing::ElementsAre;
 
+constexpr kota::MenuItemTemplate fileItems[] = {{ID_FILE_CLOSE, "&Close"}};
+constexpr kota::MenuItemTemplate editItems[] = {{ID_EDIT_UNDO, "&Undo"}, {}, {ID_EDIT_CUT, "Cu&t"}};
+constexpr kota::MenuItemTemplate viewItems[] = {{ID_VIEW_STATUS_BAR, "&Status Bar"}};
+constexpr kota::MenuItemTemplate windowItems[] = {{ID_WINDOW_NEW, "&New Window"}, {}};
+constexpr kota::MenuItemTemplate helpItems[] = {{ID_APP_ABOUT, "&About"}};
+constexpr kota::MenuPopupTemplate shellPopups[] = {{"&File", fileItems},
+                                                   {"&Edit", editItems},
+                                                   {"&View", viewItems},
+                                                   {"&Window", windowItems},
+                                                   {"&Help", helpItems}};
+constexpr kota::MenuTemplate shellMenu{.id = 1, .popups = shellPopups};
+
 // A shell that has loaded the plug-in and the second one, whose texts a language library translates in part.
 class TwoPlugIns : public Editor {
 protected:
     TwoPlugIns() {
         secondPlugIn(); // with its language library
         session.load(KOTA_SECOND);
+        shell().LoadMenu(shellMenu);
     }
 
     CDocTemplate& secondTemplate() { return *session.application().Templates().at(1); }
@@ -39,6 +53,15 @@ protected:
     }
     static int secondCommandsRun() { return exported<int()>("SecondCommandsRun", secondPlugIn())(); }
 };
+
+TEST_F(TwoPlugIns, AreAskedForTheirCountsBeforeAnythingElse) {
+    auto& calls = exported<std::vector<std::string>&()>("SecondCalls", secondPlugIn())();
+    calls.clear();
+
+    session.load(KOTA_SECOND);
+
+    EXPECT_THAT(calls, ElementsAre("count of templates", "count of tool bars", "template 0", "tool bar 0"));
+}
 
 TEST_F(TwoPlugIns, HaveModulesOfTheirOwn) {
     EXPECT_NE(&secondModule(), &plugInModule());
@@ -71,7 +94,8 @@ TEST_F(TwoPlugIns, FallBackToTheModulesTextWhereTheLanguageLibraryHasNone) {
 
 TEST_F(TwoPlugIns, FallBackToTheModulesOtherResources) {
     ASSERT_NE(secondModule().toolBar(Second::Document), nullptr);
-    EXPECT_THAT(secondModule().toolBar(Second::Document)->commands, ElementsAre(Second::OwnCommand));
+    EXPECT_THAT(secondModule().toolBar(Second::Document)->commands,
+                ElementsAre(Second::Command, Second::OwnCommand));
     EXPECT_EQ(secondModule().bitmap(4793), nullptr) << "a picture of the first one alone";
 }
 
@@ -139,6 +163,19 @@ TEST_F(TwoPlugIns, ShowTheirOwnMenusInFront) {
     EXPECT_THAT(menuBar(), ElementsAre("&File", "&Edit", "&Translated", "&View", "&Window", "&Help"));
 }
 
+TEST_F(TwoPlugIns, HaveTheirOwnMenusThirdInEveryLanguage) {
+    const kota::MenuTemplate& translated = *secondModule().menu(Second::Document);
+    ASSERT_EQ(translated.popups.size(), 6U);
+    for (const kota::MenuPopupTemplate& popup : translated.popups)
+        for (const kota::MenuPopupTemplate& own : shellPopups)
+            ASSERT_STRNE(popup.text, own.text);
+
+    createSecond();
+
+    ASSERT_EQ(shell().GetMenu()->GetMenuItemCount(), 6);
+    EXPECT_EQ(shell().GetMenu()->Entries()[2].submenu->Entries()[0].id, Second::Command);
+}
+
 TEST_F(TwoPlugIns, KeepTheMenuOfAnotherEnabledThatStandsInAGreyedOnesPlace) {
     CKota0_adDoc& first = create();
     kota::headless::User(session).selectTab("Additional output");
@@ -186,6 +223,41 @@ TEST_F(TwoPlugIns, HaveToolBarsOfTheirOwnUnderTheSameNumber) {
     EXPECT_TRUE(first.HasCommand(CommandId::FindNext));
     EXPECT_FALSE(second.HasCommand(CommandId::FindNext));
     EXPECT_TRUE(second.HasCommand(Second::OwnCommand));
+}
+
+TEST_F(TwoPlugIns, ShowTheirOwnToolBarForACommandOfBoth) {
+    CKhToolBarEx& first = *session.toolBars()[0];
+    CKhToolBarEx& second = *session.toolBars()[1];
+    ASSERT_TRUE(first.HasCommand(Second::Command) && second.HasCommand(Second::Command));
+    CKota0_adDoc& document = create();
+
+    shell().ShowToolBar(Second::Command, false);
+    EXPECT_FALSE(first.IsWindowVisible() || second.IsWindowVisible());
+
+    shell().ShowToolBar(Second::Command, true);
+    EXPECT_TRUE(first.IsWindowVisible());
+    EXPECT_FALSE(second.IsWindowVisible());
+
+    createSecond();
+    shell().ShowToolBar(Second::Command, false);
+    shell().ShowToolBar(Second::Command, true);
+    EXPECT_FALSE(first.IsWindowVisible());
+    EXPECT_TRUE(second.IsWindowVisible());
+
+    kota::input::activate(frameOf(document));
+    shell().ShowToolBar(Second::OwnCommand, false);
+    shell().ShowToolBar(Second::Command, true);
+    EXPECT_TRUE(first.IsWindowVisible());
+    EXPECT_FALSE(second.IsWindowVisible());
+}
+
+TEST_F(TwoPlugIns, ShowNoToolBarWithoutADocumentInFront) {
+    shell().ShowToolBar(Second::Command, false);
+
+    shell().ShowToolBar(Second::Command, true);
+
+    for (const auto& bar : session.toolBars())
+        EXPECT_FALSE(bar->IsWindowVisible());
 }
 
 } // namespace

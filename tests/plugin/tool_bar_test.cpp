@@ -1,6 +1,7 @@
 #include "platform/foundation/frames.h"
 #include "platform/headless/session.h"
 #include "tests/plugin/allocations.h"
+#include "tests/plugin/failing_buttons.h"
 #include "tests/plugin/plug_in.h"
 
 #include <gmock/gmock.h>
@@ -109,7 +110,9 @@ TEST_F(ToolBar, IsTheCallersToDelete) {
     create(&frame).reset();
     const int before = allocationsHeld();
 
-    create(&frame).reset();
+    auto bar = create(&frame);
+    EXPECT_GT(allocationsHeld(), before);
+    bar.reset();
 
     EXPECT_EQ(allocationsHeld(), before);
     EXPECT_THAT(frame.DockedBars(), IsEmpty());
@@ -130,6 +133,8 @@ TEST_F(ToolBar, OfTheCallersIsNotCreatedForAnIndexAboveZero) {
         CKhToolBarEx bar;
         EXPECT_EQ(init(&bar, &frame, index), 0) << index;
         expectUntouched(bar);
+        EXPECT_EQ(init(nullptr, &frame, index), 0) << index;
+        EXPECT_EQ(init(nullptr, nullptr, index), 0) << index;
     }
 }
 
@@ -144,6 +149,28 @@ TEST_F(ToolBar, ThatCannotBeMadeLeavesNothingBehind) {
     EXPECT_THAT(withoutWindow.DockedBars(), IsEmpty());
 }
 
+TEST_F(ToolBar, IsNotMadeWhenItOrItsWindowCannotBeAllocated) {
+    create(&frame).reset();
+    const int before = allocationsHeld();
+    for (const int spared : {0, 1}) {
+        const FailingAllocations failing(spared);
+        EXPECT_EQ(create(&frame), nullptr) << spared;
+        EXPECT_TRUE(failing.done()) << spared;
+    }
+    EXPECT_EQ(allocationsHeld(), before);
+    EXPECT_THAT(frame.DockedBars(), IsEmpty());
+}
+
+TEST_F(ToolBar, OfTheCallersIsNotCreatedWhenItsWindowCannotBeAllocated) {
+    CKhToolBarEx bar;
+    const FailingAllocations failing(0);
+
+    EXPECT_EQ(init(&bar, &frame), 0);
+
+    EXPECT_TRUE(failing.done());
+    expectUntouched(bar);
+}
+
 TEST_F(ToolBar, OfTheCallersStaysAsItIsWhenItCannotBeCreated) {
     CKhMDIFrameWnd withoutWindow;
     CKhToolBarEx bar;
@@ -154,6 +181,30 @@ TEST_F(ToolBar, OfTheCallersStaysAsItIsWhenItCannotBeCreated) {
 
     expectUntouched(bar);
     EXPECT_EQ(init(&bar, &frame), 1) << "and may be created later";
+}
+
+TEST_F(ToolBar, IsDeletedAgainWithoutButtons) {
+    create(&frame).reset();
+    const FailingButtons failing;
+    const int before = allocationsHeld();
+
+    EXPECT_EQ(create(&frame), nullptr);
+
+    EXPECT_EQ(allocationsHeld(), before);
+    EXPECT_THAT(frame.DockedBars(), IsEmpty());
+}
+
+TEST_F(ToolBar, OfTheCallersKeepsItsWindowWithoutButtons) {
+    CKhToolBarEx bar;
+    const FailingButtons failing;
+
+    EXPECT_EQ(init(&bar, &frame), 0);
+
+    EXPECT_EQ(bar.GetParent(), &frame);
+    EXPECT_EQ(bar.GetBarStyle(), 0U);
+    EXPECT_EQ(bar.DockingSides(), 0U);
+    EXPECT_THAT(frame.DockedBars(), IsEmpty());
+    EXPECT_EQ(frame.DockingSides(), 0U);
 }
 
 TEST_F(ToolBar, ThatHasAWindowAlreadyIsLeftAlone) {

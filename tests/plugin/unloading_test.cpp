@@ -58,6 +58,9 @@ TEST_F(UnloadingAPlugIn, TakesItsClassesAway) {
 }
 
 TEST_F(UnloadingAPlugIn, GivesItsLanguageLibraryBack) {
+    std::filesystem::copy_file(KOTA_SECOND_LANGUAGE, folder.file("libSecond_9003.so"));
+    kota::addLanguageFolder(folder.file("").c_str());
+    const LanguageChoice nobodysElse(9003);
     const HINSTANCE copy = loadCopy(KOTA_SECOND, "copy.so");
     ASSERT_NE(copy, nullptr);
     const HINSTANCE language = exported<AFX_EXTENSION_MODULE*()>("SecondRecord", copy)()->resources;

@@ -1,10 +1,12 @@
 #include "platform/language/language.h"
+#include "tests/plugin/allocations.h"
 #include "tests/plugin/attach/watched_records.h"
 #include "tests/plugin/plug_in.h"
 
 #include <dlfcn.h>
 
 #include <filesystem>
+#include <optional>
 
 using namespace kota::test;
 
@@ -70,6 +72,7 @@ TEST_F(Attaching, InitialisesTheRecordOfThePlugIn) {
 
     ASSERT_NE(lastInitialised(), nullptr);
     EXPECT_TRUE(lastInitialised()->initialised);
+    EXPECT_EQ(lastInitialised()->library, library);
     EXPECT_EQ(lastInitialised()->resources, nullptr);
     EXPECT_EQ(AfxInitExtensionModule(*lastInitialised(), library), 0) << "that was done";
 }
@@ -122,6 +125,34 @@ TEST_F(Attaching, SucceedsWithoutALanguageLibrary) {
     EXPECT_EQ(editorName(), "AD Parameters");
     EXPECT_EQ(toolBarName(), " KOTA 31 AD Tools");
     EXPECT_NE(docTemplate(), nullptr);
+}
+
+TEST_F(Attaching, SucceedsWhenItsAllocationsFail) {
+    static std::optional<FailingAllocations> failing;
+    beforeInitialising([] { failing.emplace(0, 2); });
+
+    attachIn(translated);
+
+    ASSERT_TRUE(failing);
+    EXPECT_TRUE(failing->done());
+    failing.reset();
+    ASSERT_NE(lastInitialised(), nullptr);
+    EXPECT_EQ(lastInitialised()->library, library);
+    EXPECT_EQ(lastInitialised()->resources, nullptr);
+    EXPECT_EQ(editorName(), "AD Parameters");
+    EXPECT_NE(docTemplate(), nullptr);
+}
+
+TEST_F(Attaching, IsKnownToTheFrameworkWhenTheLanguageLibraryCannotBeAllocated) {
+    static std::optional<FailingAllocations> failing;
+    beforeInitialising([] { failing.emplace(0); });
+
+    attachIn(translated);
+
+    failing.reset();
+    ASSERT_NE(lastInitialised(), nullptr);
+    EXPECT_EQ(lastInitialised()->resources, nullptr);
+    EXPECT_TRUE(CDynLinkLibrary::Knows(*lastInitialised()));
 }
 
 TEST_F(Attaching, MakesTheClassesKnownByTheirNames) {

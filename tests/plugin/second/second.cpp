@@ -1,11 +1,21 @@
 #include "platform/foundation/frames.h"
 #include "platform/framework/document.h"
 #include "platform/framework/extension.h"
+#include "platform/framework/messages.h"
 #include "platform/framework/template.h"
 #include "platform/language/language.h"
 #include "tests/plugin/second/ids.h"
 
 #include <memory>
+#include <string>
+#include <vector>
+
+#ifndef VERSIONS_AHEAD
+#define VERSIONS_AHEAD 0
+#endif
+int kota::plugInAbiVersion() {
+    return abiVersion + VERSIONS_AHEAD;
+}
 
 // A plug-in that does next to nothing, with the numbers and the class names of the first one.
 namespace {
@@ -21,8 +31,9 @@ constexpr kota::StringResource strings[] = {
     {Second::OwnCommand, "Plain prompt of its own."},
 };
 
+constexpr kota::MenuItemTemplate files[] = {{ID_FILE_CLOSE, "&Close"}};
 constexpr kota::MenuItemTemplate items[] = {{Second::Command, "&Plain command"}};
-constexpr kota::MenuPopupTemplate popups[] = {{"&File", items}, {"&Plain", items}};
+constexpr kota::MenuPopupTemplate popups[] = {{"&File", files}, {"&Plain", items}};
 constexpr kota::MenuTemplate menus[] = {{.id = Second::Document, .popups = popups}};
 
 constexpr kota::Accelerator keys[] = {
@@ -31,7 +42,7 @@ constexpr kota::Accelerator keys[] = {
 };
 constexpr kota::AcceleratorTable tables[] = {{.id = Second::Keys, .keys = keys}};
 
-constexpr UINT commands[] = {Second::OwnCommand};
+constexpr UINT commands[] = {Second::Command, Second::OwnCommand};
 constexpr kota::ToolBarTemplate bars[] = {
     {.id = Second::Document, .buttonWidth = 16, .buttonHeight = 15, .commands = commands}};
 
@@ -42,6 +53,7 @@ const kota::Module& secondModule() {
 }
 
 int commandsRun = 0;
+std::vector<std::string> calls; // of the exports that a shell makes its templates and tool bars by
 
 class CKota0_adDoc : public CDocument {
     DECLARE_DYNCREATE(CKota0_adDoc)
@@ -74,7 +86,7 @@ IMPLEMENT_DYNCREATE(CKota0_adView, CView, secondModule)
 class Attachment {
 public:
     Attachment() {
-        AfxInitExtensionModule(record, nullptr);
+        AfxInitExtensionModule(record, kota::libraryAt(&record));
         language_ = KhLangLoadResDll("Second", &record.resources, 0);
         new CDynLinkLibrary(record); // the framework's
     }
@@ -92,20 +104,26 @@ const Attachment attachment;
 extern "C" {
 
 KOTA_EXPORT int KhGetNumDocTemplates() {
+    calls.emplace_back("count of templates");
     return 1;
 }
 KOTA_EXPORT CMultiDocTemplate* KhGetDocTemplatePtr(int index) {
+    calls.push_back("template " + std::to_string(index));
     return index == 0 ? new CMultiDocTemplate(Second::Document, RUNTIME_CLASS(CKota0_adDoc),
                                               RUNTIME_CLASS(CDlgFrame), RUNTIME_CLASS(CKota0_adView))
                       : nullptr;
 }
 KOTA_EXPORT int KhGetNumToolbars() {
+    calls.emplace_back("count of tool bars");
     return 1;
 }
-KOTA_EXPORT CKhToolBarEx* KhCreateToolbar(CKhMDIFrameWnd* frame, unsigned style, unsigned id, int /*index*/) {
+KOTA_EXPORT CKhToolBarEx* KhCreateToolbar(CKhMDIFrameWnd* frame, unsigned style, unsigned id, int index) {
+    calls.push_back("tool bar " + std::to_string(index));
     auto bar = std::make_unique<CKhToolBarEx>();
-    return bar->Create(frame, style, id) && bar->LoadToolBar(secondModule(), Second::Document) ? bar.release()
-                                                                                               : nullptr;
+    if (!bar->Create(frame, style, id) || !bar->LoadToolBar(secondModule(), Second::Document))
+        return nullptr;
+    frame->DockControlBar(bar.get(), 0);
+    return bar.release();
 }
 KOTA_EXPORT int KhInitToolbar(CKhToolBarEx*, CKhMDIFrameWnd*, unsigned, unsigned, unsigned) {
     return 0;
@@ -128,5 +146,8 @@ KOTA_EXPORT AFX_EXTENSION_MODULE* SecondRecord() {
 }
 KOTA_EXPORT int SecondCommandsRun() {
     return commandsRun;
+}
+KOTA_EXPORT std::vector<std::string>& SecondCalls() {
+    return calls;
 }
 }
