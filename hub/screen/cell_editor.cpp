@@ -1,5 +1,7 @@
 #include "hub/screen/cell_editor.h"
 
+#include "hub/screen/clicked_line.h"
+
 namespace kota::hub {
 
 QWidget* CellEditor::open(CellKind kind, Qt::Alignment alignment, QWidget* parent) {
@@ -10,10 +12,20 @@ QWidget* CellEditor::open(CellKind kind, Qt::Alignment alignment, QWidget* paren
         box_->setEditable(kind == CellKind::FreeChoice);
         box_->setInsertPolicy(QComboBox::NoInsert);
         line_ = box_->lineEdit();
-        if (line_)
+        if (line_) {
             line_->setCompleter(nullptr);
+            // The keys are to come to the line itself.
+            box_->setFocusPolicy(Qt::NoFocus);
+            line_->setFocusProxy(nullptr);
+        }
     } else {
-        widget_ = line_ = new QLineEdit(parent);
+        auto* const line = new ClickedLine;
+        line->setParent(parent);
+        line->onPress = [this] {
+            if (onLinePress)
+                onLinePress();
+        };
+        widget_ = line_ = line;
         line_->setFrame(false);
     }
     if (line_)
@@ -44,6 +56,8 @@ void CellEditor::setEntries(const QStringList& entries) {
 }
 
 void CellEditor::close() {
+    if (box_)
+        box_->blockSignals(true); // it chooses the entry that is equal to its text when it loses the focus
     widget_ = nullptr;
     line_ = nullptr;
     box_ = nullptr;

@@ -6,6 +6,8 @@
 #include <QLineEdit>
 #include <QPointer>
 
+#include <functional>
+
 namespace kota::hub {
 
 // The widgets that edit a cell: a line of text, a list of entries, or both. They hold the text of the
@@ -14,7 +16,7 @@ class CellEditor {
 public:
     // The widget that lies over the cell, inside `parent`.
     QWidget* open(CellKind kind, Qt::Alignment alignment, QWidget* parent);
-    // The widget is the view's to delete.
+    // The widget is the view's to delete. Nothing is heard of it any more.
     void close();
     bool isOpen() const { return widget_ != nullptr; }
 
@@ -30,6 +32,9 @@ public:
     QString text() const;
     void setText(const QString& text);
     void setEntries(const QStringList& entries);
+
+    // The user clicked into the line of text.
+    std::function<void()> onLinePress;
 
 private:
     QPointer<QWidget> widget_;

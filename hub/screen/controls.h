@@ -76,6 +76,7 @@ public:
 
 protected:
     void refresh(const WindowState& state) override;
+    QString name(const WindowState& /*state*/) const override { return nameAround(); }
 
 private:
     void select(int index) const;

@@ -1,24 +1,16 @@
 #include "hub/screen/edit_part.h"
 
+#include "hub/screen/clicked_line.h"
 #include "hub/screen/parts.h"
 #include "hub/screen/text.h"
 
 #include <QLineEdit>
 
+#include <algorithm>
+
 namespace kota::hub {
 
 namespace {
-
-class ClickedLine : public QLineEdit {
-public:
-    std::function<void()> onPress;
-
-protected:
-    void mousePressEvent(QMouseEvent* event) override {
-        onPress();
-        QLineEdit::mousePressEvent(event);
-    }
-};
 
 constexpr int usualLength = 30;
 constexpr int noLimit = 32767; // the toolkit's own
@@ -41,9 +33,13 @@ QLineEdit& EditPart::line() const {
 
 void EditPart::refresh(const WindowState& state) {
     const int length = state.textLimit > 0 ? state.textLimit : usualLength;
-    line().setMaxLength(state.textLimit > 0 ? state.textLimit : noLimit);
-    line().setMaximumWidth((length + 2) * line().fontMetrics().averageCharWidth());
     const QString text = toQt(state.text);
+    // The limit is the user's: what the program shows may be longer, and stays whole.
+    const int limit =
+        std::max(state.textLimit > 0 ? state.textLimit : noLimit, static_cast<int>(text.size()));
+    if (line().maxLength() != limit)
+        line().setMaxLength(limit);
+    line().setMaximumWidth((length + 2) * line().fontMetrics().averageCharWidth());
     if (!composing_ && line().text() != text)
         line().setText(text);
 }

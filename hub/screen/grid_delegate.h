@@ -13,7 +13,7 @@ struct CellLook;
 // lays the editor over the cell that is being edited and has no say in when that opens or closes.
 class GridDelegate : public QStyledItemDelegate {
 public:
-    using MakeEditor = std::function<QWidget*(QWidget* parent, const QModelIndex& index)>;
+    using MakeEditor = std::function<QWidget*(const QModelIndex& index)>;
 
     GridDelegate(const GridModel& model, MakeEditor makeEditor);
 
@@ -25,6 +25,9 @@ public:
     void setModelData(QWidget* editor, QAbstractItemModel* model, const QModelIndex& index) const override;
     void updateEditorGeometry(QWidget* editor, const QStyleOptionViewItem& option,
                               const QModelIndex& index) const override;
+    // A text that does not fit its cell is told as a tip.
+    bool helpEvent(QHelpEvent* event, QAbstractItemView* view, const QStyleOptionViewItem& option,
+                   const QModelIndex& index) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:

@@ -21,6 +21,12 @@ QColor colourOf(COLORREF colour) {
     return colour >> 24 != 0 ? QColor() : QColor(colour & 0xFF, (colour >> 8) & 0xFF, (colour >> 16) & 0xFF);
 }
 
+// A line that is a header has no number.
+QString textOf(const CGXGridCore& grid, ROWCOL row, ROWCOL col) {
+    const bool noNumber = col == 0 && row <= grid.GetHeaderRows();
+    return toQt(noNumber ? CString(grid.CellText(row, col)) : grid.GetDisplayText(row, col));
+}
+
 } // namespace
 
 GridModel::GridModel(HWND grid) : grid_(grid) {}
@@ -33,10 +39,13 @@ CellLook GridModel::look(ROWCOL row, ROWCOL col) const {
     const CGXGridCore* const shown = grid();
     if (!shown || row > shown->GetRowCount() || col > shown->GetColCount())
         return {};
+    const CGXRange cells = shown->GetCoveredCellsRowCol(row, col);
+    row = cells.top;
+    col = cells.left;
     CGXStyle style;
     shown->ComposeStyleRowCol(row, col, &style);
     CellLook look;
-    look.text = toQt(shown->GetDisplayText(row, col));
+    look.text = textOf(*shown, row, col);
     look.alignment = alignmentOf(style.GetHorizontalAlignment());
     look.kind = shown->GetControl(row, col)->Kind();
     look.checked = look.kind == CellKind::CheckBox && kota::textToInt(style.ValueText()) != 0;
@@ -46,6 +55,33 @@ CellLook GridModel::look(ROWCOL row, ROWCOL col) const {
     if (shown->HasGridToolTips())
         look.toolTip = toQt(style.GetUserAttribute(GX_IDS_UA_TOOLTIPTEXT));
     return look;
+}
+
+CGXRange GridModel::cover(ROWCOL row, ROWCOL col) const {
+    const CGXGridCore* const shown = grid();
+    return shown ? shown->GetCoveredCellsRowCol(row, col) : CGXRange(row, col);
+}
+
+bool GridModel::isHeader(ROWCOL row, ROWCOL col) const {
+    const CGXGridCore* const shown = grid();
+    return !shown || row <= shown->GetHeaderRows() || col <= shown->GetHeaderCols();
+}
+
+QString GridModel::heading(ROWCOL col) const {
+    QStringList texts;
+    for (ROWCOL row = 0; grid() && row <= grid()->GetHeaderRows(); ++row)
+        texts.append(look(row, col).text.simplified());
+    texts.removeAll(QString());
+    texts.removeDuplicates(); // of a heading over several lines
+    return texts.join(", ");
+}
+
+bool GridModel::isCurrent(ROWCOL row, ROWCOL col) const {
+    ROWCOL currentRow = 0;
+    ROWCOL currentCol = 0;
+    const CGXGridCore* const shown = grid();
+    return shown && shown->GetCurrentCell(&currentRow, &currentCol) &&
+           cover(row, col).IsCellInRange(currentRow, currentCol);
 }
 
 void GridModel::follow(const GridChanges& changes) {

@@ -27,6 +27,13 @@ public:
     // Null when the grid is gone.
     CGXGridCore* grid() const;
     CellLook look(ROWCOL row, ROWCOL col) const;
+    // The cells that are shown as one with this one; what they show is that of the first.
+    CGXRange cover(ROWCOL row, ROWCOL col) const;
+    // Whether a cell is drawn as a header, and the user does nothing in it.
+    bool isHeader(ROWCOL row, ROWCOL col) const;
+    // The headings of a column, from the top.
+    QString heading(ROWCOL col) const;
+    bool isCurrent(ROWCOL row, ROWCOL col) const;
     // Tells the view of lines and columns that came or went, and of cells that are to be drawn anew.
     void follow(const GridChanges& changes);
 

@@ -6,6 +6,7 @@
 #include "platform/framework/messages.h"
 #include "platform/grid/user.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace kota::hub {
@@ -27,13 +28,19 @@ QStringList entriesOf(const CGXGridCore& grid, const QModelIndex& index) {
     return entries;
 }
 
+// What is a header is not selected.
+void selectBetween(CGXGridCore& grid, const QModelIndex& from, const QModelIndex& to) {
+    grid::selectCells(grid, CGXRange(GridModel::rowOf(from), GridModel::colOf(from),
+                                     std::max(GridModel::rowOf(to), grid.GetHeaderRows() + 1),
+                                     std::max(GridModel::colOf(to), grid.GetHeaderCols() + 1)));
+}
+
 } // namespace
 
 GridPart::GridPart(Parts& parts, HWND window)
     : Part(parts, window, new GridView), model_(window),
-      delegate_(model_,
-                [this](QWidget* parent, const QModelIndex& index) { return openEditor(parent, index); }) {
-    view().setModel(&model_);
+      delegate_(model_, [this](const QModelIndex& index) { return openEditor(index); }) {
+    view().showGrid(model_);
     view().setItemDelegate(&delegate_);
     parts.keyboard().watch(view());
     connectMouse();
@@ -56,6 +63,13 @@ void GridPart::connectMouse() {
     };
     view().onDoubleClick = [this](const QModelIndex& index) {
         queueInput([this, at = QPersistentModelIndex(index)](CGXGridCore& grid) { press(grid, at); });
+    };
+    view().onSelect = [this](const QModelIndex& from, const QModelIndex& to) {
+        queueInput(
+            [first = QPersistentModelIndex(from), last = QPersistentModelIndex(to)](CGXGridCore& grid) {
+                if (first.isValid() && last.isValid())
+                    selectBetween(grid, first, last);
+            });
     };
     view().onLinePress = [this](int line, Qt::KeyboardModifiers held) {
         queueInput([=](CGXGridCore& grid) {
@@ -104,12 +118,13 @@ bool GridPart::takeKey(QKeyEvent& key) {
     CGXGridCore* const grid = model_.grid();
     if (!grid)
         return false;
+    const bool selectsLine = key.key() == Qt::Key_Space && key.modifiers().testFlag(Qt::ShiftModifier);
     const bool list = key.key() == Qt::Key_Down && key.modifiers().testFlag(Qt::AltModifier);
     if (list)
         openList(*grid);
     else if (editor_.isOpen())
         return takeEditorKey(*grid, key);
-    else if (!typedText(key).isEmpty())
+    else if (!typedText(key).isEmpty() && !selectsLine)
         return typeOver(*grid, typedText(key));
     return list;
 }
@@ -159,7 +174,8 @@ bool GridPart::chooseByLetter(CGXGridCore& grid, const QString& text) {
 
 void GridPart::takeComposition(QInputMethodEvent& composition) {
     CGXGridCore* const grid = model_.grid();
-    if (grid && !editor_.isOpen())
+    const bool isEmpty = composition.preeditString().isEmpty() && composition.commitString().isEmpty();
+    if (grid && !editor_.isOpen() && !isEmpty) // an input method that is reset sends an empty one
         input::key(VK_F2);
     if (!grid || !editor_.line())
         return;
@@ -178,11 +194,12 @@ void GridPart::tellText(CGXGridCore& grid) {
         update();
 }
 
-QWidget* GridPart::openEditor(QWidget* parent, const QModelIndex& index) {
+QWidget* GridPart::openEditor(const QModelIndex& index) {
     const CellLook cell = model_.look(GridModel::rowOf(index), GridModel::colOf(index));
-    QWidget* const opened = editor_.open(cell.kind, cell.alignment, parent);
+    QWidget* const opened = editor_.open(cell.kind, cell.alignment, &view().widgetAt(index));
     if (const CGXGridCore* const grid = model_.grid())
         editor_.setEntries(entriesOf(*grid, index));
+    editor_.focusTarget()->setAccessibleName(model_.heading(GridModel::colOf(index)));
     parts().keyboard().watch(*editor_.focusTarget());
     connectEditor();
     return opened;
@@ -192,6 +209,7 @@ void GridPart::connectEditor() {
     if (QLineEdit* const line = editor_.line())
         QObject::connect(line, &QLineEdit::textEdited, line,
                          [this] { queueInput([this](CGXGridCore& grid) { tellText(grid); }); });
+    editor_.onLinePress = [this] { queueInput([](CGXGridCore& grid) { input::focus(grid); }); };
     DropBox* const box = editor_.box();
     if (!box)
         return;
@@ -214,7 +232,7 @@ void GridPart::refresh(const WindowState& /*state*/) {
     if (changes.layout)
         sizes_.show(*grid, view());
     if (changes.current || changes.selection)
-        view().viewport()->update();
+        view().redraw();
     const QModelIndex current = model_.currentIndex();
     view().selectionModel()->setCurrentIndex(current, QItemSelectionModel::NoUpdate);
     if (changes.scroll && current.isValid())
@@ -229,9 +247,9 @@ void GridPart::showEditor(const CGXGridCore& grid) {
     const QModelIndex edited = grid.IsEditing() ? model_.currentIndex() : QModelIndex();
     const bool isNew = edited.isValid() && (edited != editedAt_ || !editor_.isOpen());
     if (edited != editedAt_ || isNew) {
+        editor_.close();
         if (editedAt_.isValid())
             view().closePersistentEditor(editedAt_);
-        editor_.close();
         editedAt_ = edited;
         composing_ = false;
     }

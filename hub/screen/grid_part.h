@@ -24,6 +24,7 @@ public:
 
 protected:
     void refresh(const WindowState& state) override;
+    QString name(const WindowState& /*state*/) const override { return nameAround(); }
 
 private:
     GridView& view() const;
@@ -31,7 +32,7 @@ private:
     void queueInput(std::function<void(CGXGridCore&)> action) const;
     void connectMouse();
     void connectEditor();
-    QWidget* openEditor(QWidget* parent, const QModelIndex& index);
+    QWidget* openEditor(const QModelIndex& index);
 
     // Each takes what the user did to a living grid.
     void press(CGXGridCore& grid, const QModelIndex& index);

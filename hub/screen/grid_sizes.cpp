@@ -1,9 +1,7 @@
 #include "hub/screen/grid_sizes.h"
 
-#include "platform/grid/grid.h"
-
-#include <QHeaderView>
-#include <QTableView>
+#include "hub/screen/grid_model.h"
+#include "hub/screen/grid_view.h"
 
 #include <algorithm>
 
@@ -16,52 +14,84 @@ constexpr int unitsOfCharacter = 4;
 constexpr int unitsOfLine = 15;
 constexpr int margin = 6;
 
-QString headingOf(const QTableView& view, int section) {
-    return view.model()->headerData(section, Qt::Horizontal, Qt::DisplayRole).toString();
-}
-
-int scaledWidth(const QTableView& view, int width) {
+int scaledWidth(const GridView& view, int width) {
     return width * view.fontMetrics().averageCharWidth() / unitsOfCharacter;
 }
 
-int scaledHeight(const QTableView& view, int height) {
+int scaledHeight(const GridView& view, int height) {
     const QFontMetrics metrics = view.fontMetrics();
     return std::max(height * metrics.height() / unitsOfLine, metrics.height() + margin);
 }
 
-int widestWord(const QTableView& view, int section) {
+// The widest word of a column's headings but for those over several columns.
+int widestWord(const CGXGridCore& grid, const GridView& view, ROWCOL col) {
     const QFontMetrics metrics = view.horizontalHeader()->fontMetrics();
     int widest = 0;
-    for (const QString& word : headingOf(view, section).split(' '))
-        widest = std::max(widest, metrics.horizontalAdvance(word));
+    for (ROWCOL row = 0; row <= grid.GetHeaderRows(); ++row) {
+        const CGXRange cells = view.grid().cover(row, col);
+        if (cells.left != cells.right)
+            continue;
+        for (const QString& word : view.grid().look(row, col).text.split(' '))
+            widest = std::max(widest, metrics.horizontalAdvance(word));
+    }
     return widest + 2 * margin;
 }
 
-int headingHeight(const QTableView& view, int section) {
-    const QRect room(0, 0, view.columnWidth(section) - 2 * margin, 10000);
+int headingHeight(const GridView& view, ROWCOL row, ROWCOL col) {
+    const CGXRange cells = view.grid().cover(row, col);
+    if (cells.bottom != row)
+        return 0;
+    const QRect room(0, 0, view.places().area(cells).width() - 2 * margin, 10000);
     const QFontMetrics metrics = view.horizontalHeader()->fontMetrics();
-    return metrics.boundingRect(room, Qt::AlignCenter | Qt::TextWordWrap, headingOf(view, section)).height() +
-           2 * margin;
+    const QString text = view.grid().look(row, col).text;
+    return metrics.boundingRect(room, Qt::AlignCenter | Qt::TextWordWrap, text).height() + 2 * margin;
+}
+
+// Of line 0 and of the frozen lines.
+std::vector<int> frozenHeights(const CGXGridCore& grid, const GridView& view) {
+    std::vector<int> heights;
+    for (ROWCOL row = 0; row <= std::min(grid.GetFrozenRows(), grid.GetRowCount()); ++row) {
+        int height = scaledHeight(view, grid.GetRowHeight(row));
+        if (row <= grid.GetHeaderRows())
+            for (ROWCOL col = 1; col <= grid.GetColCount(); ++col)
+                height = std::max(height, headingHeight(view, row, col));
+        heights.push_back(height);
+    }
+    return heights;
 }
 
 } // namespace
 
-void GridSizes::show(const CGXGridCore& grid, QTableView& view) {
-    const int columns = view.model()->columnCount();
-    widths_.resize(static_cast<std::size_t>(columns), -1);
-    int headHeight = scaledHeight(view, grid.GetRowHeight(0));
-    for (int section = 0; section < columns; ++section) {
-        int& shown = widths_[static_cast<std::size_t>(section)];
-        const int width = grid.GetColWidth(static_cast<ROWCOL>(section + 1));
+void GridSizes::showWidths(const CGXGridCore& grid, GridView& view) {
+    const ROWCOL frozen = view.places().frozenCols();
+    if (frozen != frozenCols_)
+        widths_.clear();
+    frozenCols_ = frozen;
+    widths_.resize(grid.GetColCount(), -1);
+    for (ROWCOL col = 1; col <= grid.GetColCount(); ++col) {
+        int& shown = widths_[col - 1];
+        const int width = grid.GetColWidth(col);
         if (shown != width)
-            view.setColumnWidth(section, std::max(scaledWidth(view, width), widestWord(view, section)));
+            view.places().headOf(col).resizeSection(
+                static_cast<int>(col) - 1, std::max(scaledWidth(view, width), widestWord(grid, view, col)));
         shown = width;
-        headHeight = std::max(headHeight, headingHeight(view, section));
     }
-    view.horizontalHeader()->setFixedHeight(headHeight);
-    view.verticalHeader()->setFixedWidth(scaledWidth(view, grid.GetColWidth(0)));
-    if (grid.GetRowCount() > 0)
-        view.verticalHeader()->setDefaultSectionSize(scaledHeight(view, grid.GetRowHeight(1)));
+}
+
+void GridSizes::show(const CGXGridCore& grid, GridView& view) {
+    const ROWCOL firstLine = std::min(grid.GetFrozenRows() + 1, grid.GetRowCount());
+    const int lineHeight = scaledHeight(view, grid.GetRowHeight(firstLine));
+    if (firstLine > 0 && view.verticalHeader()->defaultSectionSize() != lineHeight)
+        view.verticalHeader()->setDefaultSectionSize(lineHeight);
+    GridPlaces& places = view.places();
+    const QString lastNumber = QString::number(grid.GetRowCount());
+    places.setNumbersWidth(
+        std::max(scaledWidth(view, grid.GetColWidth(0)),
+                 view.verticalHeader()->fontMetrics().horizontalAdvance(lastNumber) + 2 * margin));
+    places.freezeCols(std::min(grid.GetFrozenCols(), grid.GetColCount()));
+    showWidths(grid, view);
+    places.freezeRows(frozenHeights(grid, view));
+    view.followLayout();
 }
 
 } // namespace kota::hub

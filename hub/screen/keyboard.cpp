@@ -44,6 +44,11 @@ std::optional<WPARAM> heldLetter(const QKeyEvent& key) {
                               : std::nullopt;
 }
 
+// Whether the key means a command at most, and no text of a window.
+bool isForShell(const QKeyEvent& key) {
+    return heldLetter(key) || (key.key() >= Qt::Key_F1 && key.key() <= Qt::Key_F12);
+}
+
 } // namespace
 
 std::optional<WPARAM> virtualKey(int qtKey) {
@@ -111,6 +116,10 @@ void Keyboard::deliver(QEvent& event) {
         return;
     }
     auto& key = static_cast<QKeyEvent&>(event);
+    wasLast_ = true;
+    const QWidget* const target = part ? part->focusTarget() : nullptr;
+    if (target && !target->isVisible() && !isForShell(key)) // in a window that is reduced to an icon
+        return;
     if (const auto letter = heldLetter(key); letter && input::key(*letter, modifiersOf(key)))
         return;
     if (part && part->takeKey(key))

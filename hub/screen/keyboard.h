@@ -9,6 +9,8 @@
 
 class QWidget;
 
+#include <utility>
+
 namespace kota::hub {
 
 class Parts;
@@ -23,6 +25,9 @@ public:
     // Lets a widget have an event that was kept from it. For the queue's actions.
     void pass(QWidget& widget, QEvent& event);
 
+    // Whether a key was the last input since this was asked before.
+    bool takeWasLast() { return std::exchange(wasLast_, false); }
+
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
@@ -30,6 +35,7 @@ private:
 
     Parts& parts_;
     bool passing_ = false;
+    bool wasLast_ = false;
 };
 
 // None for keys that the platform has no number for.

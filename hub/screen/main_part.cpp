@@ -4,16 +4,22 @@
 #include "hub/screen/pictures.h"
 #include "hub/screen/text.h"
 #include "platform/framework/document.h"
+#include "platform/framework/guard.h"
 #include "platform/framework/messages.h"
 #include "platform/framework/scope.h"
 #include "platform/framework/template.h"
+#include "platform/framework/turn.h"
 
 #include <QCloseEvent>
+#include <QDropEvent>
+#include <QFile>
 #include <QMenuBar>
+#include <QMimeData>
 #include <QStatusBar>
 
 #include <algorithm>
 #include <array>
+#include <vector>
 
 namespace kota::hub {
 
@@ -26,14 +32,33 @@ bool isToggle(UINT id) {
     return id == ID_VIEW_TOOLBAR || id == ID_VIEW_STATUS_BAR;
 }
 
+std::vector<CString> filesOf(const QMimeData& dropped) {
+    std::vector<CString> files;
+    for (const QUrl& url : dropped.urls())
+        if (url.isLocalFile())
+            files.emplace_back(QFile::encodeName(url.toLocalFile()).constData());
+    return files;
+}
+
 } // namespace
 
 // Asks the platform to close it when the user wants to.
 class MainPart::Window : public QMainWindow {
 public:
-    explicit Window(MainPart& part) : part_(part) {}
+    explicit Window(MainPart& part) : part_(part) { setAcceptDrops(true); }
 
 protected:
+    void dragEnterEvent(QDragEnterEvent* event) override {
+        if (!filesOf(*event->mimeData()).empty())
+            event->acceptProposedAction();
+    }
+    void dropEvent(QDropEvent* event) override {
+        part_.queue([files = filesOf(*event->mimeData())](CWnd& window) {
+            const Turn turn;
+            guarded([&] { static_cast<CMDIFrameWnd&>(window).OnDropFiles(files); });
+        });
+        event->acceptProposedAction();
+    }
     void closeEvent(QCloseEvent* event) override {
         event->ignore();
         part_.queue([](CWnd& window) { input::close(window); });
@@ -89,6 +114,8 @@ void MainPart::refresh(const WindowState& state) {
 void MainPart::showMenu() {
     QMenuBar& bar = *mainWindow().menuBar();
     bar.clear();
+    for (QMenu* const old : bar.findChildren<QMenu*>(Qt::FindDirectChildrenOnly))
+        old->deleteLater(); // one of its entries may be running
     const CMenu* const entries = frame() ? frame()->GetMenu() : nullptr;
     if (!entries)
         return;

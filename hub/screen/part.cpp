@@ -33,8 +33,20 @@ void Part::update() {
                 own->setVisible(state.visible);
             own->setToolTip(toQt(state.toolTip));
         }
-    widget_->setAccessibleName(toQt(state.label.IsEmpty() ? state.text : state.label).remove('&'));
+    widget_->setAccessibleName(name(state).remove('&'));
     refresh(state);
+}
+
+QString Part::name(const WindowState& state) const {
+    return toQt(state.label.IsEmpty() ? state.text : state.label);
+}
+
+QString Part::nameAround() const {
+    const CWnd* window = CWnd::FromHandle(window_);
+    do
+        window = window ? window->GetParent() : nullptr;
+    while (window && window->State()->text.IsEmpty());
+    return window ? toQt(window->State()->text) : QString();
 }
 
 void Part::settle() {}

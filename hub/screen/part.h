@@ -48,6 +48,10 @@ protected:
     Part(Parts& parts, HWND window, QWidget* widget);
 
     virtual void refresh(const WindowState& state);
+    // What a screen reader calls the widget.
+    virtual QString name(const WindowState& state) const;
+    // The text of the nearest window around that has one.
+    QString nameAround() const;
     // Queues an input for the window, which is dropped if the window is gone by then.
     void queue(std::function<void(CWnd&)> action) const;
     Parts& parts() const { return parts_; }

@@ -108,8 +108,10 @@ void Parts::settle() {
         shown->settle();
     const Part* const part = find(::GetFocus());
     QWidget* const target = part ? part->focusTarget() : nullptr;
+    // A field that is reached by a key has its text selected.
+    const bool byKey = keyboard_.takeWasLast() && dynamic_cast<const EditPart*>(part);
     if (target && !target->hasFocus())
-        target->setFocus(Qt::OtherFocusReason);
+        target->setFocus(byKey ? Qt::TabFocusReason : Qt::OtherFocusReason);
 }
 
 } // namespace kota::hub

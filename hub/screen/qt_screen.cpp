@@ -3,17 +3,58 @@
 #include "hub/screen/text.h"
 #include "hub/screen/top_window.h"
 #include "platform/framework/dialog.h"
+#include "platform/framework/guard.h"
 #include "platform/framework/message_box.h"
+#include "platform/framework/messages.h"
 #include "platform/framework/turn.h"
 
 #include <QApplication>
+#include <QClipboard>
+#include <QComboBox>
 #include <QEventLoop>
 #include <QFileDialog>
+#include <QInputDialog>
+#include <QLineEdit>
+#include <QLocale>
 #include <QMessageBox>
 
 #include <utility>
 
 namespace kota::hub {
+
+namespace {
+
+// While a box waits for the user, input is taken again, and the program is not busy.
+class Answering {
+public:
+    explicit Answering(InputQueue& queue) : level_(queue) {
+        if (wasBusy_)
+            QGuiApplication::setOverrideCursor(Qt::ArrowCursor);
+    }
+    ~Answering() {
+        if (wasBusy_)
+            QGuiApplication::restoreOverrideCursor();
+    }
+    Answering(const Answering&) = delete;
+    Answering& operator=(const Answering&) = delete;
+
+private:
+    InputQueue::Level level_;
+    bool wasBusy_ = QGuiApplication::overrideCursor() != nullptr;
+};
+
+QMessageBox::StandardButtons buttonsOf(UINT type) {
+    switch (type) {
+    case MB_YESNOCANCEL:
+        return QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel;
+    case MB_YESNO:
+        return QMessageBox::Yes | QMessageBox::No;
+    default:
+        return QMessageBox::Ok;
+    }
+}
+
+} // namespace
 
 QtScreen::QtScreen() : queue_([this] { afterAction(); }), parts_(queue_) {
     nextTurn_.setSingleShot(true);
@@ -45,7 +86,7 @@ QMainWindow* QtScreen::makeMainWindow(const CMDIFrameWnd& frame) {
 void QtScreen::perform(std::function<void()> action) {
     queue_.add([act = std::move(action)] {
         const Turn turn;
-        act();
+        guarded(act);
     });
 }
 
@@ -62,14 +103,13 @@ QWidget* QtScreen::desktopWindowOf(HWND window) const {
 }
 
 int QtScreen::showMessageBox(const MessageBoxRequest& request) {
-    const InputQueue::Level level(queue_);
+    const Answering scope(queue_);
     QMessageBox box(desktopWindowOf(request.owner));
     box.setTextFormat(Qt::PlainText);
     box.setText(toQt(request.text));
     box.setWindowTitle(request.caption ? toQt(*request.caption) : QApplication::applicationDisplayName());
-    const bool asks = request.type == MB_YESNOCANCEL;
-    box.setIcon(asks ? QMessageBox::Question : QMessageBox::Warning);
-    box.setStandardButtons(asks ? QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel : QMessageBox::Ok);
+    box.setIcon(request.type == MB_OK ? QMessageBox::Warning : QMessageBox::Question);
+    box.setStandardButtons(buttonsOf(request.type));
     switch (box.exec()) {
     case QMessageBox::Ok:
         return IDOK;
@@ -78,17 +118,34 @@ int QtScreen::showMessageBox(const MessageBoxRequest& request) {
     case QMessageBox::No:
         return IDNO;
     default:
-        return asks ? IDCANCEL : IDOK;
+        return request.type == MB_OK ? IDOK : request.type == MB_YESNO ? IDNO : IDCANCEL;
     }
 }
 
 QStringList QtScreen::askOpenNames(const QString& filters) {
-    const InputQueue::Level level(queue_);
+    const Answering scope(queue_);
     return QFileDialog::getOpenFileNames(QApplication::activeWindow(), QString(), QString(), filters);
 }
 
+std::optional<int> QtScreen::askChoice(const QString& title, const QString& question,
+                                       const QStringList& entries) {
+    const Answering scope(queue_);
+    bool accepted = false;
+    const QString chosen =
+        QInputDialog::getItem(QApplication::activeWindow(), title, question, entries, 0, false, &accepted);
+    return accepted ? std::optional(static_cast<int>(entries.indexOf(chosen))) : std::nullopt;
+}
+
+void QtScreen::showAbout(const QString& title, const QString& text, const QPixmap& picture) {
+    const Answering scope(queue_);
+    QMessageBox box(QMessageBox::NoIcon, title, text, QMessageBox::Ok, QApplication::activeWindow());
+    box.setTextFormat(Qt::PlainText);
+    box.setIconPixmap(picture);
+    box.exec();
+}
+
 std::optional<CString> QtScreen::askSaveName(const CString& proposal) {
-    const InputQueue::Level level(queue_);
+    const Answering scope(queue_);
     const QString name =
         QFileDialog::getSaveFileName(QApplication::activeWindow(), QString(), toQt(proposal));
     return name.isEmpty() ? std::nullopt : std::optional<CString>(toPlatform(name).constData());
@@ -98,7 +155,7 @@ void QtScreen::showDialog(CDialog& dialog) {
     Part* const part = parts_.make(dialog.GetSafeHwnd());
     if (!part)
         return;
-    const InputQueue::Level level(queue_);
+    const Answering scope(queue_);
     const CWnd* const around = dialog.GetParent();
     const QPointer<QWidget> shown = part->widget();
     const QPointer<TopWindow> window =
@@ -117,6 +174,45 @@ void QtScreen::showDialog(CDialog& dialog) {
     if (shown)
         shown->setParent(nullptr); // its part deletes it
     delete window.data();
+}
+
+CString QtScreen::clipboardText() const {
+    return CString(toPlatform(QGuiApplication::clipboard()->text()).constData());
+}
+
+void QtScreen::setClipboardText(const CString& text) {
+    QGuiApplication::clipboard()->setText(toQt(text));
+}
+
+bool QtScreen::editText(UINT command, bool asked) {
+    QWidget* const focus = QApplication::focusWidget();
+    const auto* const box = qobject_cast<QComboBox*>(focus);
+    auto* const line = box ? box->lineEdit() : qobject_cast<QLineEdit*>(focus);
+    if (!line)
+        return false;
+    const bool can = command == ID_EDIT_PASTE  ? !line->isReadOnly()
+                     : command == ID_EDIT_UNDO ? line->isUndoAvailable()
+                                               : line->hasSelectedText();
+    if (asked || !can)
+        return can;
+    switch (command) {
+    case ID_EDIT_UNDO:
+        line->undo();
+        break;
+    case ID_EDIT_CUT:
+        line->cut();
+        break;
+    case ID_EDIT_COPY:
+        line->copy();
+        break;
+    default:
+        line->paste();
+    }
+    return true;
+}
+
+bool QtScreen::usesDecimalComma() const {
+    return QLocale::system().decimalPoint() == u",";
 }
 
 void QtScreen::windowsChanged(std::span<const WindowChange> changes) {

@@ -8,6 +8,7 @@
 #include <QTimer>
 
 #include <functional>
+#include <optional>
 #include <vector>
 
 namespace kota::hub {
@@ -30,9 +31,17 @@ public:
 
     // Asks for files to open; `filters` is in the toolkit's form. Empty when the user changed their mind.
     QStringList askOpenNames(const QString& filters);
+    // Asks for one of several things; its place among them, none when the user changed their mind.
+    std::optional<int> askChoice(const QString& title, const QString& question, const QStringList& entries);
+    // Tells the user about the program, with pictures beside the text.
+    void showAbout(const QString& title, const QString& text, const QPixmap& picture);
     int showMessageBox(const MessageBoxRequest& request) override;
     std::optional<CString> askSaveName(const CString& proposal) override;
     void showDialog(CDialog& dialog) override;
+    CString clipboardText() const override;
+    void setClipboardText(const CString& text) override;
+    bool editText(UINT command, bool asked) override;
+    bool usesDecimalComma() const override;
     void windowsChanged(std::span<const WindowChange> changes) override;
     void changesPending() override;
 

@@ -1,5 +1,6 @@
 #include "document/records/component.h"
 #include "document/records/decay.h"
+#include "platform/framework/property_sheet.h"
 #include "resources/ids.h"
 #include "tests/hub/shown_editor.h"
 
@@ -145,6 +146,21 @@ TEST_F(AShownPage, TellsTheUnitOfANumberWhenThePointerRests) {
     clickTab("Dispersion");
     EXPECT_FALSE(lineOf(ControlId::MinimumDispersion).toolTip().isEmpty());
     EXPECT_FALSE(index(1, 2).data(Qt::ToolTipRole).toString().isEmpty());
+}
+
+TEST_F(AShownPage, HasNamesForThoseWhoListen) {
+    EXPECT_EQ(gridView().accessibleName().toStdString(), user.tab()) << "no group is around it";
+    clickTab("Decay");
+    EXPECT_EQ(gridView().accessibleName().toStdString(), "Decay constants");
+    EXPECT_EQ(desktop().findChild<QTabBar*>()->accessibleName().toStdString(),
+              std::string(user.sheet().GetWindowText().View()));
+    EXPECT_FALSE(desktop().findChild<QTabBar*>()->accessibleName().isEmpty());
+    clickCell(1, 2);
+    type("1");
+    ASSERT_TRUE(cellLine());
+    const QString heading = gridView().model()->headerData(1, Qt::Horizontal).toString();
+    EXPECT_EQ(cellLine()->accessibleName(), heading.simplified());
+    EXPECT_FALSE(heading.isEmpty());
 }
 
 TEST_F(AShownPage, TakesAComposedTextAsOne) {

@@ -89,7 +89,7 @@ TEST_F(AShellWithChanges, KeepsTheDocumentWhoseQuestionWasCancelledAsTheProgramE
     ASSERT_TRUE(shell.window);
     EXPECT_TRUE(shell.window->isVisible());
     EXPECT_TRUE(isWritten());
-    ASSERT_EQ(frames().size(), 1U);
+    ASSERT_EQ(frames().size(), 2U);
     EXPECT_EQ(frontTitle(), "ADPar1");
     EXPECT_TRUE(front().isWindowModified());
 }

@@ -13,14 +13,18 @@
 #include <QTimer>
 
 #include <functional>
+#include <string>
 #include <utility>
+#include <vector>
 
 namespace kota::test {
 
 // A new document whose window is on the screen, with a user at mouse and keyboard.
 class ShownEditor : public Editor {
 protected:
-    ShownEditor() : document(create()), user(session), screenBefore_(attachScreen(&screen)) {
+    // With rivers: in a project that has them.
+    explicit ShownEditor(const std::vector<std::string>& rivers = {})
+        : document(createAmong(rivers)), user(session), screenBefore_(attachScreen(&screen)) {
         desktop_ = screen.makeWindow(*user.view().GetParentFrame());
         desktop_->resize(1280, 800);
         desktop_->show();
@@ -97,6 +101,13 @@ protected:
     hub::QtScreen screen;
 
 private:
+    CKota0_adDoc& createAmong(const std::vector<std::string>& rivers) {
+        if (!rivers.empty())
+            openProject();
+        shell().project().rivers = rivers;
+        return create();
+    }
+
     QWidget* desktop_ = nullptr;
     Screen* screenBefore_;
 };
