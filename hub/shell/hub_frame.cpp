@@ -1,6 +1,7 @@
 #include "hub/shell/hub_frame.h"
 
 #include "exchange/packages/packages.h"
+#include "hub/screen/pictures.h"
 #include "hub/screen/text.h"
 #include "hub/shell/menu.h"
 #include "platform/framework/document.h"
@@ -11,8 +12,10 @@
 
 #include <QApplication>
 #include <QFileInfo>
+#include <QPainter>
 
 #include <algorithm>
+#include <optional>
 
 namespace kota::hub {
 
@@ -36,6 +39,28 @@ public:
     Busy& operator=(const Busy&) = delete;
 };
 
+// The program's picture, and those of its editors below.
+QPixmap aboutPicture(const std::vector<QPixmap>& editors) {
+    constexpr int side = 64;
+    constexpr int editorSide = 32;
+    QPixmap whole(side, side + (editors.empty() ? 0 : editorSide + 8));
+    whole.fill(Qt::transparent);
+    QPainter painter(&whole);
+    painter.drawPixmap(0, 0, QApplication::windowIcon().pixmap(side));
+    QRect place(0, side + 8, editorSide, editorSide);
+    for (const QPixmap& editor : editors) {
+        painter.drawPixmap(place, editor);
+        place.translate(editorSide + 4, 0);
+    }
+    return whole;
+}
+
+// A long path without its middle.
+QString shortened(const QString& path) {
+    constexpr qsizetype most = 60;
+    return path.size() <= most ? path : path.left(most / 3) + "..." + path.right(2 * most / 3);
+}
+
 void tell(const QString& text) {
     AfxMessageBox(toPlatform(text).constData());
 }
@@ -58,8 +83,11 @@ HubFrame::~HubFrame() {
 void HubFrame::load(PlugIns plugIns) {
     plugIns_ = std::move(plugIns.loaded);
     for (const PlugIn& plugIn : plugIns_) {
-        for (auto& docTemplate : plugIn.makeTemplates())
+        for (auto& docTemplate : plugIn.makeTemplates()) {
+            if (const BitmapResource* const bitmap = docTemplate->Module().bitmap(plugIn.bitmapId()))
+                editorPictures_.push_back(pictureOf(bitmap));
             application_.AddDocTemplate(std::move(docTemplate));
+        }
         for (int index = 0; index < plugIn.toolBarCount(); ++index) {
             const UINT id = firstToolBarId + static_cast<UINT>(toolBars_.size());
             auto toolBar = plugIn.makeToolBar(*this, 0, id, index);
@@ -75,6 +103,8 @@ void HubFrame::load(PlugIns plugIns) {
 }
 
 void HubFrame::openFiles(const QStringList& paths) {
+    if (!TakePendingInput())
+        return;
     for (const QString& path : paths)
         Open(path);
 }
@@ -86,7 +116,7 @@ void HubFrame::Open(const QString& path) {
     const Busy busy;
     if (application_.OpenDocumentFile(name.constData()))
         recent_.add(path);
-    else
+    else if (!QFileInfo::exists(path))
         recent_.remove(QFileInfo(path).absoluteFilePath());
     ListRecentFiles();
 }
@@ -100,9 +130,16 @@ bool HubFrame::HasEditorFor(const QString& path) const {
 }
 
 void HubFrame::OnFileNew() {
+    if (!TakePendingInput()) // the user goes on where a text is refused
+        return;
     const auto& templates = application_.Templates();
-    if (!templates.empty())
-        templates.front()->OpenDocumentFile(nullptr);
+    QStringList kinds;
+    for (const CDocTemplate* docTemplate : templates)
+        kinds.append(toQt(docTemplate->GetDocString(CDocTemplate::DocString::FileNewName)));
+    const std::optional<int> chosen =
+        kinds.size() > 1 ? screen_.askChoice("New", "What kind of document?", kinds) : 0;
+    if (chosen && *chosen < kinds.size())
+        templates[static_cast<std::size_t>(*chosen)]->OpenDocumentFile(nullptr);
 }
 
 void HubFrame::OnFileOpen() {
@@ -116,6 +153,13 @@ void HubFrame::OnFileOpen() {
     openFiles(screen_.askOpenNames(filters.join(";;")));
 }
 
+void HubFrame::OnDropFiles(const std::vector<CString>& paths) {
+    QStringList files;
+    for (const CString& path : paths)
+        files.append(QFile::decodeName(QByteArray(path)));
+    openFiles(files);
+}
+
 void HubFrame::OnExit() {
     OnClose();
 }
@@ -127,7 +171,7 @@ void HubFrame::OnAbout() {
     const QString text =
         QString("KOTAHub %1\n\nEditors: %2")
             .arg(QApplication::applicationVersion(), editors.isEmpty() ? "none" : editors.join(", "));
-    MessageBox(toPlatform(text).constData(), "About KOTAHub");
+    screen_.showAbout("About KOTAHub", text, aboutPicture(editorPictures_));
 }
 
 bool HubFrame::OpenRecent(UINT id, int notification) {
@@ -135,7 +179,7 @@ bool HubFrame::OpenRecent(UINT id, int notification) {
     if (place < 0 || place >= recent_.paths().size())
         return false;
     if (notification == 0)
-        Open(recent_.paths()[place]);
+        openFiles({recent_.paths()[place]});
     return true;
 }
 
@@ -146,6 +190,9 @@ BOOL HubFrame::OnCmdMsg(UINT id, int notification) {
         {ID_APP_EXIT, 0, &HubFrame::OnExit},
         {ID_APP_ABOUT, 0, &HubFrame::OnAbout},
     });
+    const bool needsEditor = id == ID_FILE_NEW || id == ID_FILE_OPEN;
+    if (needsEditor && application_.Templates().empty())
+        return FALSE;
     const BOOL done = runCommand(*this, commands, id, notification) || OpenRecent(id, notification) ||
                       CKhMDIFrameWnd::OnCmdMsg(id, notification);
     if (notification == 0 && (id == ID_FILE_SAVE || id == ID_FILE_SAVE_AS))
@@ -164,18 +211,12 @@ void HubFrame::NoteSaved() {
 
 LRESULT HubFrame::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     if (message == showToolbarMessage() || message == hideToolbarMessage()) {
-        ShowToolBar(wParam, message == showToolbarMessage());
+        ShowToolBar(static_cast<UINT>(wParam), message == showToolbarMessage());
         return 0;
     }
     if (message == switchBoardMessage() || message == communicationMessage())
         return 0;
     return CKhMDIFrameWnd::WindowProc(message, wParam, lParam);
-}
-
-void HubFrame::ShowToolBar(WPARAM firstCommand, bool show) {
-    for (const auto& toolBar : toolBars_)
-        if (toolBar->HasCommand(static_cast<UINT>(firstCommand)))
-            toolBar->ShowWindow(show);
 }
 
 void HubFrame::OnUpdateFrameMenu(const CDocTemplate* front) {
@@ -189,7 +230,7 @@ void HubFrame::ListRecentFiles() {
     std::vector<CMenu::Command> entries;
     for (qsizetype i = 0; i < paths.size(); ++i) {
         const QString name = QString(QFileInfo(paths[i]).fileName()).replace("&", "&&");
-        const QString folder = QString(QFileInfo(paths[i]).path()).replace("&", "&&");
+        const QString folder = shortened(QFileInfo(paths[i]).path()).replace("&", "&&");
         entries.push_back({ID_FILE_MRU_FILE1 + static_cast<UINT>(i),
                            toPlatform(QString("&%1 %2 - %3").arg(i + 1).arg(name, folder)).constData()});
     }

@@ -26,6 +26,7 @@ public:
     void openFiles(const QStringList& paths);
 
     BOOL OnCmdMsg(UINT id, int notification) override;
+    void OnDropFiles(const std::vector<CString>& paths) override;
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
 protected:
@@ -43,13 +44,13 @@ private:
     // After a save of the document in front: its file may have got another name.
     void NoteSaved();
     void ListRecentFiles();
-    void ShowToolBar(WPARAM firstCommand, bool show);
 
     CWinApp& application_;
     QtScreen& screen_;
     std::vector<PlugIn> plugIns_;
     std::vector<std::unique_ptr<CKhToolBarEx>> toolBars_;
     RecentFiles recent_;
+    std::vector<QPixmap> editorPictures_;
 };
 
 } // namespace kota::hub

@@ -1,16 +1,43 @@
 #include "hub/shell/hub_frame.h"
-#include "hub/shell/robot.h"
+#include "hub/shell/program_icon.h"
 #include "hub/shell/tour.h"
 
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QScreen>
+#include <QSettings>
+#include <QTemporaryDir>
+#include <QTimer>
 
+#include <functional>
 #include <memory>
 #include <span>
+#include <utility>
 
 namespace {
 
 constexpr QSize firstSize(1280, 800);
+constexpr QSize leastSize(640, 440);
+
+// Does something once a window has been painted, so that the user sees that the program is busy with it.
+class AfterFirstPaint : public QObject {
+public:
+    AfterFirstPaint(QWidget& window, std::function<void()> action) : action_(std::move(action)) {
+        window.installEventFilter(this);
+    }
+
+protected:
+    bool eventFilter(QObject* window, QEvent* event) override {
+        if (event->type() == QEvent::Paint) {
+            window->removeEventFilter(this);
+            QTimer::singleShot(0, this, action_);
+        }
+        return QObject::eventFilter(window, event);
+    }
+
+private:
+    std::function<void()> action_;
+};
 
 int runHub(const QStringList& files, const QString& tourFolder) {
     CWinApp application;
@@ -20,14 +47,14 @@ int runHub(const QStringList& files, const QString& tourFolder) {
     {
         kota::hub::HubFrame frame(application, screen);
         QMainWindow* const window = screen.makeMainWindow(frame);
-        window->resize(firstSize);
+        window->setMinimumSize(leastSize);
+        window->resize(firstSize.boundedTo(window->screen()->availableSize()));
         window->show();
         screen.perform([&] { frame.load(kota::hub::loadPlugIns(kota::hub::plugInFolder())); });
         if (tourFolder.isEmpty()) {
-            screen.perform([&] { frame.openFiles(files); });
+            AfterFirstPaint opening(*window, [&] { screen.perform([&] { frame.openFiles(files); }); });
             result = QApplication::exec();
         } else {
-            kota::hub::Robot::settle();
             result = kota::hub::takeTour(frame, *window, files.value(0), tourFolder);
         }
     }
@@ -35,13 +62,18 @@ int runHub(const QStringList& files, const QString& tourFolder) {
     return result;
 }
 
-// A question about the program itself needs no display.
+// A question about the program itself needs no display, nor does the tour.
 std::unique_ptr<QCoreApplication> makeApplication(int& argc, char** argv) {
-    for (const QByteArray argument : std::span(argv, static_cast<std::size_t>(argc)))
+    for (const QByteArray argument : std::span(argv, static_cast<std::size_t>(argc))) {
         if (argument == "--help" || argument == "--version")
             return std::make_unique<QCoreApplication>(argc, argv);
+        if (argument.startsWith("--tour") && !qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
+            qputenv("QT_QPA_PLATFORM", "offscreen");
+    }
     QApplication::setStyle("Fusion");
-    return std::make_unique<QApplication>(argc, argv);
+    auto application = std::make_unique<QApplication>(argc, argv);
+    QApplication::setWindowIcon(kota::hub::programIcon());
+    return application;
 }
 
 } // namespace
@@ -60,5 +92,10 @@ int main(int argc, char** argv) {
     options.addOption(tour);
     options.addPositionalArgument("files", "The documents to open.", "[files...]");
     options.process(*application);
+    const QTemporaryDir tourSettings; // the tour leaves the user's own alone
+    if (options.isSet(tour)) {
+        QSettings::setDefaultFormat(QSettings::IniFormat);
+        QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, tourSettings.path());
+    }
     return runHub(options.positionalArguments(), options.value(tour));
 }

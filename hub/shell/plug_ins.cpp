@@ -16,7 +16,7 @@ QString plugInFolder() {
 }
 
 PlugIns loadPlugIns(const QString& folder) {
-    addLanguageFolder(QFile::encodeName(folder).constData());
+    addLanguageFolder(QFile::encodeName(QDir(folder).filePath("languages")).constData());
     PlugIns plugIns;
     for (const QFileInfo& file : QDir(folder).entryInfoList({"lib*.so"}, QDir::Files, QDir::Name)) {
         try {

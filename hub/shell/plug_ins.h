@@ -18,6 +18,7 @@ struct PlugIns {
 // Where an installed shell, and one in the build tree, has its plug-ins, beside the program's folder; the
 // environment's KOTA_PLUGINS goes before.
 QString plugInFolder();
+// Language libraries stand in the folder "languages" in it.
 PlugIns loadPlugIns(const QString& folder);
 
 } // namespace kota::hub

@@ -3,11 +3,11 @@
 #include <QApplication>
 #include <QLineEdit>
 #include <QMenuBar>
+#include <QMessageBox>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QTabBar>
 #include <QTableView>
-#include <QTimer>
 
 #include <stdexcept>
 #include <utility>
@@ -22,9 +22,29 @@ std::runtime_error missing(const QString& what) {
 
 } // namespace
 
+Robot::Robot(QMainWindow& window) : window_(window) {
+    QObject::connect(&watch_, &QTimer::timeout, &watch_, [this] { lookForBox(); });
+    watch_.start();
+}
+
 void Robot::settle() {
     for (int round = 0; round < 5; ++round)
         QCoreApplication::processEvents();
+    if (!unexpected_.isEmpty())
+        throw std::runtime_error(std::exchange(unexpected_, {}).toStdString());
+}
+
+void Robot::lookForBox() {
+    auto* const box = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+    if (!box || !box->isVisible())
+        return;
+    if (answer_) {
+        std::exchange(answer_, nullptr)(*box);
+        return;
+    }
+    const auto* const message = qobject_cast<QMessageBox*>(box);
+    unexpected_ = message ? message->text() : "a dialog opened: " + box->windowTitle();
+    box->reject();
 }
 
 void Robot::press(int key, Qt::KeyboardModifiers held) {
@@ -116,16 +136,7 @@ void Robot::fill(const QString& label, const QString& text) {
 }
 
 void Robot::answerNext(std::function<void(QWidget&)> answer) {
-    auto* const timer = new QTimer(&window_);
-    QObject::connect(timer, &QTimer::timeout, timer, [timer, act = std::move(answer)] {
-        QWidget* const modal = QApplication::activeModalWidget();
-        if (!modal || !modal->isVisible())
-            return;
-        timer->stop();
-        timer->deleteLater();
-        act(*modal);
-    });
-    timer->start();
+    answer_ = std::move(answer);
 }
 
 QPixmap Robot::picture() const {

@@ -2,22 +2,24 @@
 
 #include <QMainWindow>
 #include <QString>
+#include <QTimer>
 
 #include <functional>
 
 namespace kota::hub {
 
 // A user at mouse and keyboard, for the tour: it sends the toolkit's own events to the widgets that are
-// there. What it does not find is an error (std::runtime_error).
+// there. What it does not find is an error (std::runtime_error), and so is a box that it was not told to
+// expect: the robot closes it.
 class Robot {
 public:
-    explicit Robot(QMainWindow& window) : window_(window) {}
+    explicit Robot(QMainWindow& window);
 
     // Lets everything happen that was set going.
-    static void settle();
+    void settle();
     // To the widget with the focus.
-    static void press(int key, Qt::KeyboardModifiers held = Qt::NoModifier);
-    static void type(const QString& text);
+    void press(int key, Qt::KeyboardModifiers held = Qt::NoModifier);
+    void type(const QString& text);
     void clickTab(const QString& caption);
     // How many lines the grid in front has.
     int lineCount() const;
@@ -33,11 +35,15 @@ public:
     QPixmap picture() const;
 
 private:
-    static void click(QWidget& widget, QPoint at);
+    void click(QWidget& widget, QPoint at);
+    void lookForBox();
     template <class Widget>
     Widget& visible(const char* what) const;
 
     QMainWindow& window_;
+    QTimer watch_;
+    std::function<void(QWidget&)> answer_; // to the box that is expected
+    QString unexpected_;                   // what another one said
 };
 
 } // namespace kota::hub

@@ -18,11 +18,14 @@ namespace {
 
 class Tour {
 public:
-    Tour(HubFrame& frame, QMainWindow& window, const QDir& folder)
-        : frame_(frame), window_(window), robot_(window), folder_(folder) {}
+    Tour(HubFrame& frame, QMainWindow& window, Robot& robot, const QDir& folder)
+        : frame_(frame), window_(window), robot_(robot), folder_(folder) {}
 
     void play(const QString& document) {
         copy_ = folder_.filePath(QFileInfo(document).fileName());
+        if (QFileInfo(copy_) == QFileInfo(document))
+            throw std::runtime_error(
+                ("the pictures need another folder than that of " + document).toStdString());
         QFile::remove(copy_);
         if (!QFile::copy(document, copy_))
             throw std::runtime_error(("cannot copy " + document + " to " + copy_).toStdString());
@@ -50,7 +53,7 @@ private:
 
     void open(const QString& what) {
         frame_.openFiles({copy_});
-        Robot::settle();
+        robot_.settle();
         expect(frame_.MDIGetActive() != nullptr, "the document did not open");
         step(what);
     }
@@ -74,28 +77,28 @@ private:
     void renameComponent() {
         robot_.clickTab("Components");
         robot_.clickCell(1, 1);
-        Robot::type("oxygen demand");
+        robot_.type("oxygen demand");
         step("A component gets another name");
-        Robot::press(Qt::Key_Return);
+        robot_.press(Qt::Key_Return);
         step("It is in upper case");
     }
 
     void insertDecayLine() {
         robot_.clickTab("Decay");
         robot_.clickCell(1, 2);
-        Robot::press(Qt::Key_Insert);
+        robot_.press(Qt::Key_Insert);
         step("A decay line is inserted");
         const int line = robot_.lineCount();
         robot_.clickCell(line, 1);
-        Robot::type("d");
+        robot_.type("d");
         step("Its component is chosen by a letter");
         robot_.clickCell(line, 2);
-        Robot::type("0.0x");
-        Robot::press(Qt::Key_Return);
+        robot_.type("0.0x");
+        robot_.press(Qt::Key_Return);
         step("A bad number is refused at its cell");
-        Robot::press(Qt::Key_Backspace);
-        Robot::type("2");
-        Robot::press(Qt::Key_Return);
+        robot_.press(Qt::Key_Backspace);
+        robot_.type("2");
+        robot_.press(Qt::Key_Return);
         step("A good one is taken");
     }
 
@@ -113,7 +116,7 @@ private:
     }
 
     void saveAndReopen() {
-        Robot::press(Qt::Key_S, Qt::ControlModifier);
+        robot_.press(Qt::Key_S, Qt::ControlModifier);
         expect(!frame_.MDIGetActive()->GetActiveDocument()->IsModified(), "the document was not saved");
         step("The document is saved");
         robot_.choose("File", "Close");
@@ -126,7 +129,7 @@ private:
 
     HubFrame& frame_;
     QMainWindow& window_;
-    Robot robot_;
+    Robot& robot_;
     QDir folder_;
     QString copy_;
     int count_ = 0;
@@ -136,10 +139,12 @@ private:
 
 int takeTour(HubFrame& frame, QMainWindow& window, const QString& document, const QString& folder) {
     try {
+        Robot robot(window);
+        robot.settle();
         if (!QDir().mkpath(folder))
             throw std::runtime_error(("cannot make the folder " + folder).toStdString());
         QTextStream(stdout) << "Pictures in " << QDir(folder).absolutePath() << ':' << Qt::endl;
-        Tour(frame, window, QDir(folder)).play(document);
+        Tour(frame, window, robot, QDir(folder)).play(document);
         return 0;
     } catch (const std::runtime_error& error) {
         QTextStream(stderr) << "The tour ended early: " << error.what() << Qt::endl;

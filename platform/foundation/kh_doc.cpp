@@ -3,6 +3,7 @@
 #include "platform/foundation/kept_file.h"
 #include "platform/framework/message_box.h"
 #include "platform/framework/screen.h"
+#include "platform/framework/template.h"
 #include "platform/kvs/kvs.h"
 
 #include <cerrno>
@@ -30,6 +31,21 @@ bool looksInterrupted(const char* path) {
     std::error_code failed;
     return fs::file_size(path, failed) == 0 && fs::exists(kota::KeptFile::keptName(path), failed);
 }
+
+// Gives the focus back, if a save took it away.
+class FocusScope {
+public:
+    FocusScope() = default;
+    ~FocusScope() {
+        if (!::GetFocus())
+            ::SetFocus(holder_);
+    }
+    FocusScope(const FocusScope&) = delete;
+    FocusScope& operator=(const FocusScope&) = delete;
+
+private:
+    HWND holder_ = ::GetFocus();
+};
 
 } // namespace
 
@@ -61,23 +77,48 @@ BOOL CKhDoc::OnOpenDocument(const char* path) {
 }
 
 BOOL CKhDoc::DoSave(const char* path) {
-    TakePendingInput(); // a text that is refused stays in its cell, and out of the file
+    const FocusScope scope;
+    if (HasFocus())
+        ::SetFocus(nullptr); // a text that is refused stays where it is, and out of the file
     CString name = path;
-    if (name.IsEmpty()) {
-        kota::Screen* screen = kota::attachedScreen();
-        const auto chosen = screen ? screen->askSaveName(GetTitle()) : std::nullopt;
-        if (!chosen)
-            return FALSE;
-        name = *chosen;
-    }
+    if (name.IsEmpty())
+        name = AskName();
+    if (name.IsEmpty())
+        return FALSE;
+    if (!MayWriteInstead(name))
+        return FALSE;
     CString problem;
-    const HWND focus = ::GetFocus();
     const BOOL saved = SaveKeeping(name, problem);
-    if (!::GetFocus()) // which a save takes away
-        ::SetFocus(focus);
     if (!problem.IsEmpty())
         AfxMessageBox(problem);
     return saved;
+}
+
+CString CKhDoc::AskName() const {
+    kota::Screen* const screen = kota::attachedScreen();
+    const auto chosen =
+        screen ? screen->askSaveName(GetPathName().IsEmpty() ? GetTitle() : GetPathName()) : std::nullopt;
+    return chosen.value_or(CString());
+}
+
+// Whoever named a file knows of it, but perhaps not of the one that is written.
+bool CKhDoc::MayWriteInstead(const CString& named) const {
+    const CString written = WrittenPathName(named);
+    const CDocTemplate* const docTemplate = GetDocTemplate();
+    const CDocument* const open = docTemplate ? docTemplate->FindOpen(written) : nullptr;
+    CString question;
+    if (open && open != this) {
+        question.Format("%s is open in another window. Close it there first.",
+                        static_cast<const char*>(written));
+        AfxMessageBox(question);
+        return false;
+    }
+    std::error_code failed;
+    const bool isNamed = fs::equivalent(named.View(), written.View(), failed);
+    if (written == named || isNamed || !fs::exists(written.View(), failed))
+        return true;
+    question.Format("%s exists already. Do you want to replace it?", static_cast<const char*>(written));
+    return AfxMessageBox(question, MB_YESNO) == IDYES;
 }
 
 // The old file is back in its place by the time this returns 0. `problem` is what the user has to be told.

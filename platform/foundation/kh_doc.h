@@ -25,5 +25,8 @@ protected:
     virtual CString WrittenPathName(const char* path) const;
 
 private:
+    // Asks the user for a name; empty when they changed their mind.
+    CString AskName() const;
+    bool MayWriteInstead(const CString& named) const;
     BOOL SaveKeeping(const CString& path, CString& problem);
 };

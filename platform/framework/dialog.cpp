@@ -1,12 +1,15 @@
 #include "platform/framework/dialog.h"
 
+#include "platform/framework/input.h"
 #include "platform/framework/message_box.h"
 #include "platform/framework/screen.h"
 #include "platform/framework/tab_order.h"
 #include "platform/framework/turn.h"
 #include "platform/framework/window_registry.h"
 
+#include <algorithm>
 #include <string_view>
+#include <vector>
 
 IMPLEMENT_DYNAMIC(CDialog, CWnd, kota::platformModule)
 
@@ -142,16 +145,38 @@ BOOL CDialog::OnCmdMsg(UINT id, int notification) {
     return TRUE;
 }
 
+namespace {
+
+// By an arrow key, the radio button beside one comes on.
+bool chooseBeside(const CWnd& radio, WPARAM key) {
+    const bool forward = key == VK_DOWN || key == VK_RIGHT;
+    if (!forward && key != VK_UP && key != VK_LEFT)
+        return false;
+    const std::vector<CWnd*> group = kota::radioGroupOf(radio);
+    const auto here = std::ranges::find(group, &radio) - group.begin();
+    const auto count = std::ssize(group);
+    kota::input::click(*group[static_cast<std::size_t>((here + (forward ? 1 : count - 1)) % count)]);
+    return true;
+}
+
+} // namespace
+
 BOOL CDialog::PreTranslateMessage(MSG* message) {
     if (message->message != WM_KEYDOWN)
         return FALSE;
-    const CWnd* const target = FromHandle(message->hwnd);
-    const bool inGrid = target && target->State()->setup.kind == kota::WindowKind::Grid;
-    if (message->wParam == VK_TAB && target && !inGrid) {
+    using kota::WindowKind;
+    CWnd* const target = FromHandle(message->hwnd);
+    const WindowKind kind = target ? target->State()->setup.kind : WindowKind::Plain;
+    // In a grid Tab goes from cell to cell; Ctrl+Tab leaves it.
+    if (message->wParam == VK_TAB && target && (kind != WindowKind::Grid || GetKeyState(VK_CONTROL) < 0)) {
         if (CWnd* const next = kota::nextInTabOrder(*this, *target, GetKeyState(VK_SHIFT) < 0))
             next->SetFocus();
         return TRUE;
     }
+    if (kind == WindowKind::RadioButton && chooseBeside(*target, message->wParam))
+        return TRUE;
+    if (kind == WindowKind::PushButton && message->wParam == VK_RETURN)
+        return kota::input::click(*target);
     if (!modal_ || (message->wParam != VK_RETURN && message->wParam != VK_ESCAPE))
         return FALSE;
     message->wParam == VK_RETURN ? OnOK() : OnCancel();

@@ -88,15 +88,18 @@ void CDocument::OnCloseDocument() {
     delete this;
 }
 
+bool CDocument::HasFocus() const {
+    const CWnd* const focus = CWnd::GetFocus();
+    return focus && std::ranges::any_of(views_, [&](const CView* view) { return view->IsChild(focus); });
+}
+
 BOOL CDocument::TakePendingInput() {
-    CWnd* const focus = CWnd::GetFocus();
-    const bool isHere =
-        focus && std::ranges::any_of(views_, [&](const CView* view) { return view->IsChild(focus); });
-    if (!isHere)
+    if (!HasFocus())
         return TRUE;
-    const HWND holder = focus->GetSafeHwnd();
+    const HWND holder = ::GetFocus();
+    const unsigned boxes = kota::boxesShown();
     ::SetFocus(nullptr);
-    const bool taken = ::GetFocus() != holder;
+    const bool taken = ::GetFocus() != holder && kota::boxesShown() == boxes;
     if (!::GetFocus())
         ::SetFocus(holder);
     return taken;

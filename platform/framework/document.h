@@ -58,8 +58,10 @@ public:
     virtual BOOL CanCloseFrame(CFrameWnd* frame);
     // Gives the frames of the document its title, numbered where there are several, and the mark of changes.
     void UpdateFrameTitles();
-    // Has the control with the focus, if it is in a view of the document, take over what the user typed. 0
-    // when it refuses.
+    // Whether a control in a view of the document has the focus.
+    bool HasFocus() const;
+    // Has that control take over what the user typed. 0 when it refuses, or tells the user in a box why it
+    // did not.
     BOOL TakePendingInput();
     // The template that made the document; null when somebody else did, who owns it.
     CDocTemplate* GetDocTemplate() const { return docTemplate_; }

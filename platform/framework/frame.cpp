@@ -98,7 +98,11 @@ void CFrameWnd::SetActiveView(CView* view) {
 
 BOOL CFrameWnd::OnCmdMsg(UINT id, int notification) {
     CView* const view = GetActiveView();
-    return (view && view->OnCmdMsg(id, notification)) || CWnd::OnCmdMsg(id, notification);
+    // The control with the focus comes first: the commands of the Edit menu are its own.
+    CWnd* const focus = GetFocus();
+    const bool isControl = view && view->IsChild(focus);
+    return (isControl && focus->OnCmdMsg(id, notification)) || (view && view->OnCmdMsg(id, notification)) ||
+           CWnd::OnCmdMsg(id, notification);
 }
 
 LRESULT CFrameWnd::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {

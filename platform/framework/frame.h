@@ -84,7 +84,7 @@ public:
     // The frames, in the order in which they were made.
     std::vector<CMDIChildWnd*> Children() const;
 
-    // Closes the frames first, and stays if one of them does.
+    // Asks about the changes of all documents before it closes any.
     void OnClose() override;
     CMenu* GetMenu() override { return &menu_; }
     // A command goes to the frame in front first. The main window's own are "New Window", and
@@ -99,6 +99,10 @@ public:
     // The prompt of a command and, behind a line feed, its tool tip: the front document's, or else this
     // window's.
     CString GetMessageString(UINT id) const;
+    // Files were dropped on the window. The base does nothing with them.
+    virtual void OnDropFiles(const std::vector<CString>& paths);
+    // Has the document in front take over what is being typed; false when that is refused.
+    bool TakePendingInput() const;
     // The main window's own keys, which must outlive it.
     void LoadAccelerators(const kota::AcceleratorTable& own) { ownKeys_ = &own; }
 

@@ -4,6 +4,7 @@
 #include "platform/framework/frame.h"
 #include "platform/framework/guard.h"
 #include "platform/framework/property_sheet.h"
+#include "platform/framework/tab_order.h"
 #include "platform/framework/turn.h"
 
 #include <algorithm>
@@ -72,11 +73,21 @@ bool translated(MSG& message) {
     return false;
 }
 
-// Runs the command of a key. A key whose command is greyed or has no handler goes on to the window.
+bool isInDialog(HWND handle) {
+    for (const CWnd* window = CWnd::FromHandle(handle); window; window = window->GetParent())
+        if (window->State()->setup.kind == WindowKind::Dialog)
+            return true;
+    return false;
+}
+
+// Runs the command of a key. The key goes no further, also where the command is greyed or has no handler: to
+// the window it would be another key. A dialog's keys are its own.
 bool accelerated(const Accelerator& pressed) {
     auto* const mainFrame = dynamic_cast<CMDIFrameWnd*>(AfxGetMainWnd());
-    const UINT id = mainFrame ? mainFrame->CommandOf(pressed) : 0;
-    return id != 0 && command(id);
+    const UINT id = mainFrame && !isInDialog(::GetFocus()) ? mainFrame->CommandOf(pressed) : 0;
+    if (id != 0)
+        command(id);
+    return id != 0;
 }
 
 void tellParent(const CWnd& control, int notification) {
@@ -102,20 +113,8 @@ std::string_view firstCharacters(std::string_view text, int count) {
 }
 
 void comeOn(CWnd& radio) {
-    const auto& siblings = radio.GetParent()->State()->children;
-    const auto isRadio = [](HWND handle) {
-        return CWnd::FromHandle(handle)->State()->setup.kind == WindowKind::RadioButton;
-    };
-    const auto startsGroup = [](HWND handle) { return CWnd::FromHandle(handle)->State()->startsGroup; };
-    const auto here = std::ranges::find(siblings, radio.GetSafeHwnd());
-    auto first = here;
-    while (first != siblings.begin() && !startsGroup(*first) && isRadio(*std::prev(first)))
-        --first;
-    for (auto other = first; other != siblings.end() && isRadio(*other); ++other) {
-        if (other != first && startsGroup(*other))
-            break;
-        CWnd::FromHandle(*other)->SetCheck(other == here);
-    }
+    for (CWnd* const other : radioGroupOf(radio))
+        other->SetCheck(other == &radio);
 }
 
 } // namespace

@@ -17,8 +17,8 @@ struct Modifiers {
 };
 
 // A key goes down: PreTranslateMessage of the window with the focus and of those around it, then the main
-// window's accelerators, and then, if none took it, its own WM_KEYDOWN; F1 asks it for help. True when
-// somebody took the key.
+// window's accelerators, and then, if it is no accelerator, its own WM_KEYDOWN; F1 asks it for help. True
+// when somebody took the key.
 KOTA_API bool key(WPARAM key, Modifiers modifiers = {});
 // A window is clicked or tabbed to. False when it, or the one that has the focus, refuses.
 KOTA_API bool focus(CWnd& window);

@@ -127,12 +127,21 @@ std::vector<CMDIChildWnd*> CMDIFrameWnd::Children() const {
     return frames;
 }
 
+// All questions come first: a user who changes their mind at the last one has lost nothing.
 void CMDIFrameWnd::OnClose() {
-    for (CMDIChildWnd* child : Children()) {
-        const HWND handle = child->GetSafeHwnd();
-        if (IsWindow(handle))
-            child->OnClose();
-        if (IsWindow(handle))
+    std::vector<HWND> frames;
+    for (const CMDIChildWnd* child : Children())
+        frames.push_back(child->GetSafeHwnd());
+    std::vector<const CDocument*> asked;
+    for (const HWND frame : frames) {
+        auto* const child = static_cast<CMDIChildWnd*>(FromHandle(frame));
+        CDocument* const document = child ? child->GetActiveDocument() : nullptr;
+        if (!document || std::ranges::find(asked, document) != asked.end())
+            continue;
+        asked.push_back(document);
+        if (document->IsModified())
+            child->ActivateFrame(); // so that the user sees what the question is about
+        if (!document->TakePendingInput() || !document->SaveModified())
             return;
     }
     CFrameWnd::OnClose();
@@ -150,6 +159,14 @@ BOOL CMDIFrameWnd::OnCmdMsg(UINT id, int notification) {
            CFrameWnd::OnCmdMsg(id, notification);
 }
 
+bool CMDIFrameWnd::TakePendingInput() const {
+    const CMDIChildWnd* const front = MDIGetActive();
+    CDocument* const document = front ? front->GetActiveDocument() : nullptr;
+    return !document || document->TakePendingInput();
+}
+
+void CMDIFrameWnd::OnDropFiles(const std::vector<CString>& /*paths*/) {}
+
 void CMDIFrameWnd::OnNextPane() {
     ActivateBeside(1);
 }
@@ -158,8 +175,7 @@ void CMDIFrameWnd::OnPreviousPane() {
 }
 
 void CMDIFrameWnd::ActivateBeside(std::ptrdiff_t step) {
-    CDocument* const document = MDIGetActive()->GetActiveDocument();
-    if (document && !document->TakePendingInput())
+    if (!TakePendingInput())
         return;
     const std::vector<CMDIChildWnd*> frames = Children();
     const auto here = std::ranges::find(frames, MDIGetActive());
@@ -173,7 +189,7 @@ void CMDIFrameWnd::OnWindowNew() {
     CMDIChildWnd* const active = MDIGetActive();
     CDocument* const document = active ? active->GetActiveDocument() : nullptr;
     CDocTemplate* const docTemplate = document ? document->GetDocTemplate() : nullptr;
-    if (!docTemplate)
+    if (!docTemplate || !TakePendingInput())
         return;
     if (CFrameWnd* const frame = docTemplate->CreateNewFrame(document, active))
         docTemplate->InitialUpdateFrame(frame, document, TRUE);

@@ -6,6 +6,14 @@
 
 #include <cstdio>
 
+namespace {
+unsigned shown = 0;
+} // namespace
+
+unsigned kota::boxesShown() {
+    return shown;
+}
+
 int MessageBox(HWND owner, const char* text, const char* caption, UINT type) {
     kota::Screen* screen = kota::attachedScreen();
     if (!screen) {
@@ -15,6 +23,7 @@ int MessageBox(HWND owner, const char* text, const char* caption, UINT type) {
     kota::MessageBoxRequest request{.owner = owner, .text = text, .caption = {}, .type = type};
     if (caption)
         request.caption = caption;
+    ++shown;
     kota::tellScreen(); // a screen draws on while the box is open
     return screen->showMessageBox(request);
 }

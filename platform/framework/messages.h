@@ -34,6 +34,7 @@ inline constexpr WPARAM VK_SHIFT = 16;
 inline constexpr WPARAM VK_CONTROL = 17;
 inline constexpr WPARAM VK_MENU = 18;
 inline constexpr WPARAM VK_ESCAPE = 27;
+inline constexpr WPARAM VK_SPACE = 32;
 inline constexpr WPARAM VK_PRIOR = 33;
 inline constexpr WPARAM VK_NEXT = 34;
 inline constexpr WPARAM VK_END = 35;

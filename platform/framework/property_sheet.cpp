@@ -90,6 +90,16 @@ BOOL CPropertySheet::SetActivePage(int index) {
     return TRUE;
 }
 
+BOOL CPropertySheet::PreTranslateMessage(MSG* message) {
+    const bool isPaging = message->message == WM_KEYDOWN && GetKeyState(VK_CONTROL) < 0 &&
+                          (message->wParam == VK_PRIOR || message->wParam == VK_NEXT);
+    if (!isPaging || active_ < 0)
+        return CWnd::PreTranslateMessage(message);
+    const int step = message->wParam == VK_NEXT ? 1 : GetPageCount() - 1;
+    SetActivePage((active_ + step) % GetPageCount());
+    return TRUE;
+}
+
 bool CPropertySheet::LeaveActivePage() {
     CPropertyPage* const page = GetActivePage();
     if (!page)

@@ -54,6 +54,8 @@ public:
     // the page in front or that page itself refuses, and while another change is under way.
     BOOL SetActivePage(int index);
     BOOL SetActivePage(CPropertyPage* page);
+    // Ctrl with Page Up or Page Down goes to the page beside, round the ends.
+    BOOL PreTranslateMessage(MSG* message) override;
 
 private:
     bool LeaveActivePage();

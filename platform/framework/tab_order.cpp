@@ -42,6 +42,24 @@ bool stopsAtTab(const CWnd& window) {
     }
 }
 
+std::vector<CWnd*> radioGroupOf(const CWnd& radio) {
+    std::vector<CWnd*> group;
+    bool isHere = false;
+    for (const HWND handle : radio.GetParent()->State()->children) {
+        CWnd* const sibling = CWnd::FromHandle(handle);
+        const bool isRadio = sibling->State()->setup.kind == WindowKind::RadioButton;
+        if (!isRadio || sibling->State()->startsGroup) {
+            if (isHere)
+                break;
+            group.clear();
+        }
+        if (isRadio)
+            group.push_back(sibling);
+        isHere = isHere || sibling == &radio;
+    }
+    return group;
+}
+
 CWnd* firstInTabOrder(const CWnd& dialog) {
     const std::vector<CWnd*> stops = stopsOf(dialog);
     return stops.empty() ? nullptr : stops.front();

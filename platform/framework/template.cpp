@@ -5,8 +5,10 @@
 #include "platform/framework/frame.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <memory>
 #include <string_view>
+#include <system_error>
 
 IMPLEMENT_DYNAMIC(CDocTemplate, CObject, kota::platformModule)
 IMPLEMENT_DYNAMIC(CMultiDocTemplate, CDocTemplate, kota::platformModule)
@@ -62,8 +64,11 @@ void CDocTemplate::InitialUpdateFrame(CFrameWnd* frame, CDocument* document, BOO
 
 CDocument* CDocTemplate::FindOpen(const char* path) const {
     const CString wanted(path);
-    const auto found = std::ranges::find_if(
-        documents_, [&](const CDocument* document) { return document->GetPathName() == wanted; });
+    const auto found = std::ranges::find_if(documents_, [&](const CDocument* document) {
+        std::error_code failed; // where one of them does not exist
+        return document->GetPathName() == wanted ||
+               std::filesystem::equivalent(document->GetPathName().View(), wanted.View(), failed);
+    });
     return found == documents_.end() ? nullptr : *found;
 }
 

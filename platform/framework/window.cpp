@@ -3,6 +3,8 @@
 #include "platform/framework/frame.h"
 #include "platform/framework/guard.h"
 #include "platform/framework/message_box.h"
+#include "platform/framework/messages.h"
+#include "platform/framework/screen.h"
 #include "platform/framework/turn.h"
 #include "platform/framework/window_registry.h"
 
@@ -251,6 +253,17 @@ void CWnd::NotifyParent(int notification) {
     if (state)
         ::SendMessage(kota::dialogAround(handle_), WM_COMMAND, commandParam(state->setup.id, notification),
                       reinterpret_cast<LPARAM>(handle_));
+}
+
+BOOL CWnd::OnCmdMsg(UINT id, int notification) {
+    const bool isEdit = State() && State()->setup.kind == kota::WindowKind::Edit;
+    const bool isForText =
+        id == ID_EDIT_UNDO || id == ID_EDIT_CUT || id == ID_EDIT_COPY || id == ID_EDIT_PASTE;
+    const bool asked = notification == CN_UPDATE_COMMAND_UI;
+    kota::Screen* const screen = kota::attachedScreen();
+    if (isEdit && isForText && screen && (asked || notification == 0))
+        return screen->editText(id, asked);
+    return CCmdTarget::OnCmdMsg(id, notification);
 }
 
 LRESULT CWnd::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {

@@ -100,6 +100,8 @@ public:
     virtual bool LetFocusGo();
     // The focus leaves this window or one inside it.
     virtual void FocusLeft(HWND window);
+    // An edit hands the commands of the Edit menu to the screen.
+    BOOL OnCmdMsg(UINT id, int notification) override;
     // What the window does with a message: a command goes to OnCmdMsg, the rest to DefWindowProc.
     virtual LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam);
 

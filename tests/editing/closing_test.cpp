@@ -169,4 +169,85 @@ TEST_F(AShellThatEndsTheDocument, WhenACellIsLeftForAnotherLineEndsAllItsWindows
     expectNothingIsLeft();
 }
 
+// Two changed documents, the second one in front.
+class AShellThatEnds : public DocumentWindow {
+protected:
+    AShellThatEnds() {
+        for (const char* name : {"A", "B"}) {
+            create();
+            User user(session);
+            user.putCursor(1, 1);
+            user.enter(name);
+        }
+    }
+    void end() { kota::input::close(shell()); }
+
+    TempFolder folder;
+};
+
+TEST_F(AShellThatEnds, LosesNothingWhenTheUserCancelsAtTheLastQuestion) {
+    session.screen().answerBox(IDNO);
+    session.screen().answerBox(IDCANCEL);
+
+    end();
+
+    ASSERT_EQ(shell().Children().size(), 2U);
+    EXPECT_TRUE(shell().Children().front()->GetActiveDocument()->IsModified());
+}
+
+TEST_F(AShellThatEnds, BringsTheDocumentToTheFrontThatItAsksAbout) {
+    std::vector<const CMDIChildWnd*> inFront;
+    session.screen().onBox = [&] { inFront.push_back(shell().MDIGetActive()); };
+    const auto frames = shell().Children();
+    session.screen().answerBox(IDNO);
+    session.screen().answerBox(IDCANCEL);
+
+    end();
+
+    EXPECT_THAT(inFront, ElementsAre(frames[0], frames[1]));
+}
+
+TEST_F(AShellThatEnds, ClosesAllOnceAllIsAnswered) {
+    session.screen().answerBox(IDNO);
+    session.screen().answerBox(IDNO);
+
+    end();
+
+    EXPECT_FALSE(shell().GetSafeHwnd());
+    EXPECT_THAT(boxes(), testing::SizeIs(2));
+}
+
+// An edit of a number that holds none.
+class ABadNumberInAnEdit : public DocumentWindow {
+protected:
+    ABadNumberInAnEdit() {
+        create();
+        User user(session);
+        user.selectTab("Dispersion");
+        user.typeInto(ControlId::DispersionExponent, "1x");
+    }
+
+    TempFolder folder;
+};
+
+TEST_F(ABadNumberInAnEdit, KeepsItsWindowOpenWhenItWasTold) {
+    session.screen().answerBox(IDOK);
+    EXPECT_FALSE(User(session).closeWindow());
+    EXPECT_THAT(boxes(), ElementsAre("Invalid floating point number!"));
+    ASSERT_TRUE(shell().MDIGetActive());
+    EXPECT_EQ(User(session).textOf(ControlId::DispersionExponent), "1x");
+}
+
+TEST_F(ABadNumberInAnEdit, IsToldOnceInASave) {
+    session.screen().answerBox(IDOK);
+    EXPECT_TRUE(session.saveAs(*shell().MDIGetActive()->GetActiveDocument(), folder.file("river.AD31")));
+    EXPECT_THAT(boxes(), ElementsAre("Invalid floating point number!"));
+}
+
+TEST_F(ABadNumberInAnEdit, KeepsItsWindowInFrontOfANewOne) {
+    session.screen().answerBox(IDOK);
+    User(session).newWindow();
+    EXPECT_EQ(shell().Children().size(), 1U);
+}
+
 } // namespace

@@ -21,13 +21,28 @@ TEST_F(KeptVersion, ASaveNamesTheDocumentAfterTheFileThatWasWritten) {
 TEST_F(KeptVersion, IsThatOfTheFileThatIsWrittenNotOfTheOneNamed) {
     folder.write("river.AD31", "upper");
     folder.write("river.ad31", "lower");
+    session.screen().answerBox(IDYES);
 
-    save("river.ad31");
+    EXPECT_TRUE(save("river.ad31"));
 
+    EXPECT_THAT(toldNow(),
+                ElementsAre(folder.file("river.AD31") + " exists already. Do you want to replace it?"));
     EXPECT_THAT(folder.read("river.AD31"), HasSubstr("target KOTA0_AD {"));
     EXPECT_EQ(folder.read("river.AD31~"), "upper");
     EXPECT_EQ(folder.read("river.ad31"), "lower");
     EXPECT_FALSE(folder.has("river.ad31~"));
+}
+
+TEST_F(KeptVersion, IsNotNeededWhereTheUserKeepsTheOtherFile) {
+    folder.write("river.AD31", "another");
+    document.SetModifiedFlag(TRUE);
+    session.screen().answerBox(IDNO);
+
+    EXPECT_FALSE(save("river.v2"));
+
+    EXPECT_EQ(folder.read("river.AD31"), "another");
+    EXPECT_TRUE(document.IsModified());
+    EXPECT_THAT(filesInFolder(), ElementsAre("river.AD31"));
 }
 
 TEST_F(KeptVersion, IsTheOneBeforeTheLastSave) {

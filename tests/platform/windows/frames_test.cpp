@@ -215,7 +215,7 @@ TEST_F(ClosingTheMainWindow, IsNotDoneWhenADocumentStays) {
 
     EXPECT_FALSE(kota::input::close(session.mainWindow()));
 
-    EXPECT_THAT(frames(), ElementsAre(&frameOf(second)));
+    EXPECT_THAT(frames(), ElementsAre(&frameOf(first), &frameOf(second))) << "and so does the one before";
 }
 
 TEST_F(ClosingTheMainWindow, EndsAllWithoutAQuestionWhenTheShellDoesIt) {
