@@ -7,7 +7,6 @@
 #include <QScreen>
 #include <QSettings>
 #include <QTemporaryDir>
-#include <QTimer>
 
 #include <functional>
 #include <memory>
@@ -19,7 +18,8 @@ namespace {
 constexpr QSize firstSize(1280, 800);
 constexpr QSize leastSize(640, 440);
 
-// Does something once a window has been painted, so that the user sees that the program is busy with it.
+// Does something as soon as a window is being painted, so that the user sees that the program is busy with
+// it.
 class AfterFirstPaint : public QObject {
 public:
     AfterFirstPaint(QWidget& window, std::function<void()> action) : action_(std::move(action)) {
@@ -30,7 +30,7 @@ protected:
     bool eventFilter(QObject* window, QEvent* event) override {
         if (event->type() == QEvent::Paint) {
             window->removeEventFilter(this);
-            QTimer::singleShot(0, this, action_);
+            action_();
         }
         return QObject::eventFilter(window, event);
     }
@@ -48,7 +48,8 @@ int runHub(const QStringList& files, const QString& tourFolder) {
         kota::hub::HubFrame frame(application, screen);
         QMainWindow* const window = screen.makeMainWindow(frame);
         window->setMinimumSize(leastSize);
-        window->resize(firstSize.boundedTo(window->screen()->availableSize()));
+        const QSize room = tourFolder.isEmpty() ? window->screen()->availableSize() : firstSize;
+        window->resize(firstSize.boundedTo(room)); // pictures are of one size, whatever the display
         window->show();
         screen.perform([&] { frame.load(kota::hub::loadPlugIns(kota::hub::plugInFolder())); });
         if (tourFolder.isEmpty()) {

@@ -19,8 +19,9 @@ struct Load {
     const Resources* resources;
 };
 
+// There to the very end: libraries free others in their own last moments.
 std::vector<Load>& loads() {
-    static std::vector<Load> all;
+    static auto& all = *new std::vector<Load>;
     return all;
 }
 

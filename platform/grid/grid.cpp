@@ -7,7 +7,6 @@
 
 #include <algorithm>
 #include <limits>
-#include <ranges>
 #include <utility>
 
 IMPLEMENT_DYNAMIC(CGXGridCore, CWnd, kota::platformModule)
@@ -86,7 +85,8 @@ BOOL CGXGridCore::AppendLine() {
 void CGXGridCore::DeleteSelection() {
     std::vector<ROWCOL> lines;
     GetSelectedRows(lines);
-    for (const ROWCOL line : std::views::reverse(lines))
+    std::ranges::reverse(lines);
+    for (const ROWCOL line : lines)
         RemoveRows(line, line);
 }
 

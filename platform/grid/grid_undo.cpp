@@ -2,7 +2,6 @@
 #include "platform/grid/grid_data.h"
 
 #include <algorithm>
-#include <ranges>
 
 using kota::grid::CellPlace;
 using kota::grid::Replay;
@@ -65,7 +64,8 @@ bool CGXGridCore::Data::replay(Replay which) {
     kota::grid::Step step = journal.begin(which);
     const ReplayScope scope(journal, which);
     std::vector<CellPlace> changed;
-    for (kota::grid::Change& change : std::views::reverse(step.changes)) {
+    std::ranges::reverse(step.changes);
+    for (kota::grid::Change& change : step.changes) {
         if (const auto* const cell = std::get_if<kota::grid::CellWas>(&change))
             changed.push_back(cell->place);
         takeBack(std::move(change));
