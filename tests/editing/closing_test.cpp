@@ -217,6 +217,11 @@ TEST_F(AShellThatEnds, ClosesAllOnceAllIsAnswered) {
     EXPECT_THAT(boxes(), testing::SizeIs(2));
 }
 
+class AWindowOfADocument : public DocumentWindow {
+protected:
+    TempFolder folder;
+};
+
 // An edit of a number that holds none.
 class ABadNumberInAnEdit : public DocumentWindow {
 protected:
@@ -248,6 +253,17 @@ TEST_F(ABadNumberInAnEdit, KeepsItsWindowInFrontOfANewOne) {
     session.screen().answerBox(IDOK);
     User(session).newWindow();
     EXPECT_EQ(shell().Children().size(), 1U);
+}
+
+TEST_F(AWindowOfADocument, IsNotSavedOverTheFileOfAnotherWindow) {
+    ASSERT_TRUE(session.saveAs(create(), folder.file("river.AD31")));
+    CKota0_adDoc& other = create();
+    session.screen().answerBox(IDOK);
+
+    EXPECT_FALSE(session.saveAs(other, folder.file("river.ad31")));
+
+    EXPECT_THAT(boxes(), ElementsAre(HasSubstr("river.AD31 is open in another window.")));
+    EXPECT_TRUE(other.GetPathName().IsEmpty());
 }
 
 } // namespace
