@@ -6,8 +6,6 @@
 
 #include <functional>
 
-class QScrollBar;
-
 namespace kota::hub {
 
 class GridView;

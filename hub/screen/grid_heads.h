@@ -2,8 +2,6 @@
 
 #include <QHeaderView>
 
-#include <functional>
-
 namespace kota::hub {
 
 class GridView;

@@ -6,10 +6,9 @@
 #include <QObject>
 
 #include <optional>
+#include <utility>
 
 class QWidget;
-
-#include <utility>
 
 namespace kota::hub {
 

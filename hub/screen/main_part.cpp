@@ -4,11 +4,9 @@
 #include "hub/screen/pictures.h"
 #include "hub/screen/text.h"
 #include "platform/framework/document.h"
-#include "platform/framework/guard.h"
 #include "platform/framework/messages.h"
 #include "platform/framework/scope.h"
 #include "platform/framework/template.h"
-#include "platform/framework/turn.h"
 
 #include <QCloseEvent>
 #include <QDropEvent>
@@ -54,8 +52,7 @@ protected:
     }
     void dropEvent(QDropEvent* event) override {
         part_.queue([files = filesOf(*event->mimeData())](CWnd& window) {
-            const Turn turn;
-            guarded([&] { static_cast<CMDIFrameWnd&>(window).OnDropFiles(files); });
+            input::drop(static_cast<CMDIFrameWnd&>(window), files);
         });
         event->acceptProposedAction();
     }

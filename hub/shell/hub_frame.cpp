@@ -201,8 +201,7 @@ BOOL HubFrame::OnCmdMsg(UINT id, int notification) {
 }
 
 void HubFrame::NoteSaved() {
-    const CMDIChildWnd* const front = MDIGetActive();
-    CDocument* const document = front ? front->GetActiveDocument() : nullptr;
+    CDocument* const document = FrontDocument();
     if (!document || document->IsModified() || document->GetPathName().IsEmpty())
         return;
     recent_.add(QFile::decodeName(QByteArray(document->GetPathName())));

@@ -73,8 +73,7 @@ bool hasPopup(const kota::MenuTemplate& menu, const kota::MenuPopupTemplate& doc
 }
 
 const kota::Module* moduleInFront(const CMDIFrameWnd& frame) {
-    const CMDIChildWnd* const child = frame.MDIGetActive();
-    const CDocument* const document = child ? child->GetActiveDocument() : nullptr;
+    const CDocument* const document = frame.FrontDocument();
     const CDocTemplate* const docTemplate = document ? document->GetDocTemplate() : nullptr;
     return docTemplate ? &docTemplate->Module() : nullptr;
 }

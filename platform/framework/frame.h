@@ -79,6 +79,8 @@ public:
 
     // The frame in front; null when there is none.
     CMDIChildWnd* MDIGetActive() const;
+    // Its document; null when there is none.
+    CDocument* FrontDocument() const;
     // Brings a frame to the front; null brings none. The one before is told first.
     void MDIActivate(CMDIChildWnd* child);
     // The frames, in the order in which they were made.

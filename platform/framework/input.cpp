@@ -224,6 +224,13 @@ bool activate(CMDIChildWnd& frame) {
     });
 }
 
+void drop(CMDIFrameWnd& frame, const std::vector<CString>& paths) {
+    perform([&] {
+        frame.OnDropFiles(paths);
+        return true;
+    });
+}
+
 bool close(CWnd& window) {
     return perform([&] {
         const HWND handle = window.GetSafeHwnd();

@@ -2,7 +2,10 @@
 
 #include "platform/framework/window.h"
 
+#include <vector>
+
 class CMDIChildWnd;
+class CMDIFrameWnd;
 class CPropertySheet;
 
 // What a user does with windows. A screen calls these for mouse and keyboard, a test by itself: both go the
@@ -36,6 +39,8 @@ KOTA_API bool command(UINT id);
 KOTA_API bool canCommand(UINT id);
 // A document's frame is brought to the front. False when what has the focus refuses to let it go.
 KOTA_API bool activate(CMDIChildWnd& frame);
+// Files are dropped on the main window.
+KOTA_API void drop(CMDIFrameWnd& frame, const std::vector<CString>& paths);
 // The close button of a frame or a dialog.
 KOTA_API bool close(CWnd& window);
 

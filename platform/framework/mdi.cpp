@@ -16,8 +16,11 @@ CMDIFrameWnd* mainFrameOf(const CWnd& child) {
                                                                    : nullptr;
 }
 
-const CDocTemplate* templateOf(const CMDIChildWnd* child) {
-    const CDocument* const document = child ? child->GetActiveDocument() : nullptr;
+CDocument* documentOf(const CMDIChildWnd* child) {
+    return child ? child->GetActiveDocument() : nullptr;
+}
+
+CDocTemplate* templateOf(const CDocument* document) {
     return document ? document->GetDocTemplate() : nullptr;
 }
 
@@ -60,6 +63,10 @@ CMDIChildWnd* CMDIFrameWnd::MDIGetActive() const {
     return static_cast<CMDIChildWnd*>(FromHandle(activeChild_));
 }
 
+CDocument* CMDIFrameWnd::FrontDocument() const {
+    return documentOf(MDIGetActive());
+}
+
 void CMDIFrameWnd::MDIActivate(CMDIChildWnd* child) {
     CMDIChildWnd* const before = MDIGetActive();
     if (child == before)
@@ -89,7 +96,7 @@ void CMDIFrameWnd::ShowMenuOf(CMDIChildWnd* child) {
             before->topEntries_.push_back(entry.enabled);
     }
     menuOf_ = shown;
-    OnUpdateFrameMenu(templateOf(child));
+    OnUpdateFrameMenu(templateOf(documentOf(child)));
     for (std::size_t i = 0; child && i < child->topEntries_.size(); ++i)
         menu_.EnableMenuItem(static_cast<UINT>(i),
                              MF_BYPOSITION | (child->topEntries_[i] ? MF_ENABLED : MF_GRAYED));
@@ -106,7 +113,7 @@ UINT CMDIFrameWnd::CommandOf(const kota::Accelerator& pressed) const {
         });
         return found == table.keys.end() ? 0 : found->command;
     };
-    if (const CDocTemplate* const docTemplate = templateOf(MDIGetActive()))
+    if (const CDocTemplate* const docTemplate = templateOf(FrontDocument()))
         for (const kota::AcceleratorTable& table : docTemplate->Module().accelerators())
             if (const UINT command = commandIn(table))
                 return command;
@@ -114,7 +121,7 @@ UINT CMDIFrameWnd::CommandOf(const kota::Accelerator& pressed) const {
 }
 
 CString CMDIFrameWnd::GetMessageString(UINT id) const {
-    const CDocTemplate* const docTemplate = templateOf(MDIGetActive());
+    const CDocTemplate* const docTemplate = templateOf(FrontDocument());
     const CString documents = docTemplate ? docTemplate->Module().string(id) : CString();
     return documents.IsEmpty() ? GetRuntimeClass()->Module().string(id) : documents;
 }
@@ -135,7 +142,7 @@ void CMDIFrameWnd::OnClose() {
     std::vector<const CDocument*> asked;
     for (const HWND frame : frames) {
         auto* const child = static_cast<CMDIChildWnd*>(FromHandle(frame));
-        CDocument* const document = child ? child->GetActiveDocument() : nullptr;
+        CDocument* const document = documentOf(child);
         if (!document || std::ranges::find(asked, document) != asked.end())
             continue;
         asked.push_back(document);
@@ -160,8 +167,7 @@ BOOL CMDIFrameWnd::OnCmdMsg(UINT id, int notification) {
 }
 
 bool CMDIFrameWnd::TakePendingInput() const {
-    const CMDIChildWnd* const front = MDIGetActive();
-    CDocument* const document = front ? front->GetActiveDocument() : nullptr;
+    CDocument* const document = FrontDocument();
     return !document || document->TakePendingInput();
 }
 
@@ -186,11 +192,10 @@ void CMDIFrameWnd::ActivateBeside(std::ptrdiff_t step) {
 }
 
 void CMDIFrameWnd::OnWindowNew() {
-    CMDIChildWnd* const active = MDIGetActive();
-    CDocument* const document = active ? active->GetActiveDocument() : nullptr;
-    CDocTemplate* const docTemplate = document ? document->GetDocTemplate() : nullptr;
+    CDocument* const document = FrontDocument();
+    CDocTemplate* const docTemplate = templateOf(document);
     if (!docTemplate || !TakePendingInput())
         return;
-    if (CFrameWnd* const frame = docTemplate->CreateNewFrame(document, active))
+    if (CFrameWnd* const frame = docTemplate->CreateNewFrame(document, MDIGetActive()))
         docTemplate->InitialUpdateFrame(frame, document, TRUE);
 }

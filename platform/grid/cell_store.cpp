@@ -125,8 +125,6 @@ bool CellStore::isReadOnly(ROWCOL row, ROWCOL col) const {
 }
 
 void CellStore::layOverCell(ROWCOL row, ROWCOL col, const CGXStyle& style, ReadOnlyLock lock) {
-    if (style.HasValue())
-        setValue(row, col, style.ValueText());
     if (style.HasOnlyValue() || (lock == ReadOnlyLock::On && isReadOnly(row, col)))
         return;
     CGXStyle look = style;

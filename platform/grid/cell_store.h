@@ -76,7 +76,8 @@ public:
     std::string_view text(ROWCOL row, ROWCOL col) const;
 
     CGXStyle& standard() { return standard_; }
-    // Lays a style over the cell (line, column); with the lock, only its value where that is read-only.
+    // Lays a style over the cell, but for its value; over the line (column) with it. With the lock, what is
+    // read-only keeps its style, and takes a value alone.
     void layOverCell(ROWCOL row, ROWCOL col, const CGXStyle& style, ReadOnlyLock lock);
     void layOverRow(ROWCOL row, const CGXStyle& style, ReadOnlyLock lock);
     void layOverCol(ROWCOL col, const CGXStyle& style, ReadOnlyLock lock);

@@ -34,10 +34,13 @@ bool CGXGridCore::Data::storeValue(ROWCOL row, ROWCOL col, std::string_view text
 void CGXGridCore::Data::layOverCell(CellPlace place, const CGXStyle& style, ReadOnlyLock lock) {
     if (style.HasValue())
         storeValue(place.row, place.col, style.ValueText());
-    kota::grid::CellContent before = cells.content(place.row, place.col);
+    const kota::grid::StyleId before = cells.cellStyle(place.row, place.col);
     cells.layOverCell(place.row, place.col, style, lock);
-    if (cells.cellStyle(place.row, place.col) != before.style)
-        remember(kota::grid::CellWas{place, std::move(before)}, place);
+    if (cells.cellStyle(place.row, place.col) == before)
+        return;
+    kota::grid::CellContent was = cells.content(place.row, place.col);
+    was.style = before;
+    remember(kota::grid::CellWas{place, std::move(was)}, place);
 }
 
 void CGXGridCore::Data::layOverRow(ROWCOL row, const CGXStyle& style, ReadOnlyLock lock) {

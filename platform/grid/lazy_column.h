@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <iterator>
 #include <utility>
 #include <vector>
 
@@ -27,10 +28,12 @@ public:
     // Takes the values of the lines `first` to `last`, with which they go.
     LazyColumn take(std::size_t first, std::size_t last) {
         LazyColumn taken;
-        const std::size_t end = std::min(last + 1, lines_.size());
-        for (std::size_t line = first; line < end; ++line)
-            taken.lines_.push_back(std::move(lines_[line]));
-        erase(first, last);
+        if (first >= lines_.size())
+            return taken;
+        const auto from = lines_.begin() + static_cast<std::ptrdiff_t>(first);
+        const auto end = lines_.begin() + static_cast<std::ptrdiff_t>(std::min(last + 1, lines_.size()));
+        taken.lines_.assign(std::make_move_iterator(from), std::make_move_iterator(end));
+        lines_.erase(from, end);
         return taken;
     }
     // Gives lines that were never written values, from `line` on.
@@ -46,14 +49,6 @@ public:
         const auto gap = lines_.begin() + static_cast<std::ptrdiff_t>(line);
         std::move_backward(gap, lines_.end() - static_cast<std::ptrdiff_t>(count), lines_.end());
         std::generate_n(gap, count, [] { return T{}; });
-    }
-
-    void erase(std::size_t first, std::size_t last) {
-        if (first >= lines_.size())
-            return;
-        const std::size_t end = std::min(last + 1, lines_.size());
-        lines_.erase(lines_.begin() + static_cast<std::ptrdiff_t>(first),
-                     lines_.begin() + static_cast<std::ptrdiff_t>(end));
     }
 
 private:

@@ -10,21 +10,8 @@ using Cell = std::pair<ROWCOL, ROWCOL>;
 constexpr kota::input::Modifiers shift{.shift = true};
 
 // A grid of three local lines and five columns.
-class AGrid : public kota::test::OnATab {
+class AGrid : public kota::test::OnThreeLines {
 protected:
-    AGrid() : OnATab("Decay") {
-        document().decayList.DeleteAll();
-        for (const char* river : {"A", "B", "C"})
-            kota::test::addLocal(document().decayList, 0, river, 1.0);
-        fill();
-    }
-
-    std::string rivers() {
-        std::string all;
-        for (ROWCOL row = 1; row <= grid().GetRowCount(); ++row)
-            all += user->held(row, 4).empty() ? "-" : user->held(row, 4);
-        return all;
-    }
     bool addToSelection(ROWCOL row) {
         return kota::grid::clickLineHeader(grid(), row, kota::grid::Selecting::Add);
     }

@@ -97,4 +97,23 @@ protected:
     std::optional<headless::User> user;
 };
 
+// A user in front of the decay tab with a local line at each of the rivers A, B and C.
+class OnThreeLines : public OnATab {
+protected:
+    OnThreeLines() : OnATab("Decay") {
+        document().decayList.DeleteAll();
+        for (const char* river : {"A", "B", "C"})
+            addLocal(document().decayList, 0, river, 1.0);
+        fill();
+    }
+
+    // The rivers of the lines, "-" for a line without one.
+    std::string rivers() {
+        std::string all;
+        for (ROWCOL row = 1; row <= grid().GetRowCount(); ++row)
+            all += user->held(row, 4).empty() ? "-" : user->held(row, 4);
+        return all;
+    }
+};
+
 } // namespace kota::test

@@ -11,21 +11,8 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 
 // The decay tab with three local lines.
-class AnUndo : public kota::test::OnATab {
+class AnUndo : public kota::test::OnThreeLines {
 protected:
-    AnUndo() : OnATab("Decay") {
-        document().decayList.DeleteAll();
-        for (const char* river : {"A", "B", "C"})
-            kota::test::addLocal(document().decayList, 0, river, 1.0);
-        fill();
-    }
-
-    std::string rivers() {
-        std::string all;
-        for (ROWCOL row = 1; row <= grid().GetRowCount(); ++row)
-            all += user->held(row, 4).empty() ? "-" : user->held(row, 4);
-        return all;
-    }
     std::string storedRivers() {
         std::string all;
         for (POSITION position = document().decayList.GetHeadPosition(); position;)
