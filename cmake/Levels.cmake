@@ -50,3 +50,13 @@ function(kota_level NAME)
         add_dependencies(check_headers ${NAME}_headers)
     endif()
 endfunction()
+
+# kota_language_library(NAME LEVEL level SOURCES file...)
+#
+# The texts of a library in one language, as a library of its own that KhLangLoadResDll finds: NAME is
+# BASE_LANGUAGE. Its sources see what the level sees.
+function(kota_language_library NAME)
+    cmake_parse_arguments(LANGUAGE "" "LEVEL" "SOURCES" ${ARGN})
+    add_library(${NAME} MODULE ${LANGUAGE_SOURCES})
+    target_include_directories(${NAME} PRIVATE $<TARGET_PROPERTY:${LANGUAGE_LEVEL},INCLUDE_DIRECTORIES>)
+endfunction()

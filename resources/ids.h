@@ -51,6 +51,10 @@ inline constexpr UINT InvalidNumber = 5009;
 inline constexpr UINT NotFound = 5010;
 inline constexpr UINT LastAlreadyFound = 5011;
 inline constexpr UINT LineNumberTooSmall = 5012;
+inline constexpr UINT IncompleteLines = 5013; // for shells and siblings: a save itself does not ask
+inline constexpr UINT HeadIceThickness = 5014;
+inline constexpr UINT HeadIceWidth = 5015;
+inline constexpr UINT HeadIceQuality = 5016;
 } // namespace StringId
 
 namespace MenuId {

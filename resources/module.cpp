@@ -1,9 +1,8 @@
 #include "resources/module.h"
 
 #include "resources/bitmaps.h"
-#include "resources/dialogs.h"
-#include "resources/menu.h"
-#include "resources/strings.h"
+#include "resources/texts.h"
+#include "resources/tool_bar.h"
 
 constinit AFX_EXTENSION_MODULE kota0AdRecord;
 

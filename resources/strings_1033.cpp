@@ -1,5 +1,5 @@
 #include "resources/ids.h"
-#include "resources/strings.h"
+#include "resources/texts.h"
 
 namespace {
 
@@ -86,6 +86,12 @@ constexpr kota::StringResource strings[] = {
     {StringId::NotFound, "Searched item not found"},
     {StringId::LastAlreadyFound, "The last occurence of searched item already found"},
     {StringId::LineNumberTooSmall, "Line number must be greater than 0"},
+    {StringId::IncompleteLines,
+     "Lines in the editor data-tables with none or only partially\nfilled information will be deleted when "
+     "saving the editor file.\nProceed Yes/No ?"},
+    {StringId::HeadIceThickness, "Ice Thickness"},
+    {StringId::HeadIceWidth, "Width of ice cover"},
+    {StringId::HeadIceQuality, "Quality"},
 };
 
 } // namespace

@@ -1,6 +1,6 @@
+#include "resources/tool_bar.h"
 #include "platform/framework/messages.h"
 #include "resources/ids.h"
-#include "resources/menu.h"
 
 namespace {
 

@@ -10,19 +10,15 @@
 
 // A grid page is a table of columns, a row per column; what is the same in all pages reads the table.
 
-// How a record's value becomes the text of a cell.
+// How a record's number becomes the text of a cell. Names and whole numbers stand as they are.
 enum class Print {
-    Text,
-    Int,
-    Unit,    // through the unit style
     Fixed,   // "%-lf", no unit
+    Unit,    // through the unit style
     General, // "%-g", no unit
 };
 
-// How the text of a cell becomes the record's value.
+// How the text of a cell becomes the record's number.
 enum class Store {
-    Text,
-    Int,
     Number, // no unit
     Unit,   // through the unit style
 };
@@ -56,8 +52,8 @@ struct ColumnFace {
     int unitItem = 0;          // 0 for none
     std::size_t unitEntry = 0; // of the page's unit styles
     const char* unitFormat = "%-lf";
-    Print print = Print::Text;
-    Store store = Store::Text;
+    Print print = Print::Fixed;
+    Store store = Store::Number;
     CellDefault newLine = {};    // in a new default line
     CellDefault newLocated = {}; // in a new located line
     CellDefault blank = {};      // what a blank cell takes when the tab is left

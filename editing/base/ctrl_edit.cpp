@@ -67,11 +67,14 @@ void CCtrlEdit::TakeText() {
         return;
     }
     const double value = style_.UnitConvertFromBase(kota::textToDouble(text.View()), 0);
-    const bool changed = value != *target;
+    if (value != *target) {
+        *target = value;
+        TellDocument();
+    }
+    if (!target || !GetSafeHwnd()) // whoever was told has closed the window
+        return;
     *target = value;
     ShowTarget();
-    if (changed)
-        TellDocument();
 }
 
 void CCtrlEdit::TellDocument() {

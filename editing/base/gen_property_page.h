@@ -39,8 +39,6 @@ public:
                             double chainage, int chainageTest, int textTest);
     virtual void FillFromDocument(CKota0_adDoc* source);
     virtual void StoreToDocument();
-    // Tells the grids which of their columns takes the project's river names.
-    virtual void SetRiverColumns();
     // The cell that decides on others of its line has changed.
     virtual void OnRowColumnChanged(ROWCOL row, ROWCOL col);
     // The record of a grid line as far as its place goes, for the caller to delete; null when there is none.
@@ -54,6 +52,8 @@ public:
     virtual int ComponentIndexOf(int n, int kindFilter);
     virtual void SetActiveGrid(CGenGrid* grid);
     virtual CGenGrid* GetActiveGrid();
+    // Tells the grids which of their columns takes the project's river names.
+    virtual void SetRiverColumns();
 
 protected:
     // Enables the main menu's third entry, that of the grids.

@@ -28,6 +28,19 @@ QStringList entriesOf(const CGXGridCore& grid, const QModelIndex& index) {
     return entries;
 }
 
+// That of the standard style.
+QFont fontOf(const CGXGridCore& grid) {
+    CGXStyle style;
+    grid.ComposeStyleRowCol(0, 0, &style);
+    const CGXFont wanted = style.GetFont();
+    QFont font;
+    if (!wanted.face.IsEmpty())
+        font.setFamily(toQt(wanted.face));
+    if (wanted.points > 0)
+        font.setPointSize(wanted.points);
+    return font;
+}
+
 // What is a header is not selected.
 void selectBetween(CGXGridCore& grid, const QModelIndex& from, const QModelIndex& to) {
     grid::selectCells(grid, CGXRange(GridModel::rowOf(from), GridModel::colOf(from),
@@ -229,8 +242,10 @@ void GridPart::refresh(const WindowState& /*state*/) {
         return;
     const GridChanges changes = grid->TakeChanges();
     model_.follow(changes);
-    if (changes.layout)
+    if (changes.layout) {
+        view().setFont(fontOf(*grid));
         sizes_.show(*grid, view());
+    }
     if (changes.current || changes.selection)
         view().redraw();
     const QModelIndex current = model_.currentIndex();

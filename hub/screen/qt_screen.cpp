@@ -13,6 +13,8 @@
 #include <QComboBox>
 #include <QEventLoop>
 #include <QFileDialog>
+#include <QFontDatabase>
+#include <QFontInfo>
 #include <QInputDialog>
 #include <QLineEdit>
 #include <QLocale>
@@ -213,6 +215,22 @@ bool QtScreen::editText(UINT command, bool asked) {
 
 bool QtScreen::usesDecimalComma() const {
     return QLocale::system().decimalPoint() == u",";
+}
+
+CString QtScreen::fontFor(int language) const {
+    constexpr int japanese = 1041;
+    if (language != japanese)
+        return {};
+    const QString own = QFontInfo(QApplication::font()).family();
+    const QStringList families = QFontDatabase::families(QFontDatabase::Japanese);
+    if (families.isEmpty() || families.contains(own))
+        return {};
+    // The proportional ones of the usual families, and else whatever is there.
+    for (const char* const name : {"Noto Sans CJK JP", "Noto Sans JP", "IPAexGothic", "IPAPGothic",
+                                   "VL PGothic", "TakaoPGothic", "IPAGothic"})
+        if (families.contains(QLatin1String(name)))
+            return name;
+    return toPlatform(families.first()).constData();
 }
 
 void QtScreen::windowsChanged(std::span<const WindowChange> changes) {

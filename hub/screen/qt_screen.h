@@ -42,6 +42,7 @@ public:
     void setClipboardText(const CString& text) override;
     bool editText(UINT command, bool asked) override;
     bool usesDecimalComma() const override;
+    CString fontFor(int language) const override;
     void windowsChanged(std::span<const WindowChange> changes) override;
     void changesPending() override;
 

@@ -112,7 +112,7 @@ void HubFrame::openFiles(const QStringList& paths) {
 void HubFrame::Open(const QString& path) {
     const QByteArray name = QFile::encodeName(QFileInfo(path).absoluteFilePath());
     if (!HasEditorFor(path))
-        tell(QString("%1 cannot be opened: no editor here is for files of its kind.").arg(path));
+        tell(hubText(HubText::NoEditorFor).arg(path));
     const Busy busy;
     if (application_.OpenDocumentFile(name.constData()))
         recent_.add(path);
@@ -137,7 +137,7 @@ void HubFrame::OnFileNew() {
     for (const CDocTemplate* docTemplate : templates)
         kinds.append(toQt(docTemplate->GetDocString(CDocTemplate::DocString::FileNewName)));
     const std::optional<int> chosen =
-        kinds.size() > 1 ? screen_.askChoice("New", "What kind of document?", kinds) : 0;
+        kinds.size() > 1 ? screen_.askChoice(hubText(HubText::New), hubText(HubText::WhatKind), kinds) : 0;
     if (chosen && *chosen < kinds.size())
         templates[static_cast<std::size_t>(*chosen)]->OpenDocumentFile(nullptr);
 }
@@ -168,10 +168,10 @@ void HubFrame::OnAbout() {
     QStringList editors;
     for (const PlugIn& plugIn : plugIns_)
         editors.append(toQt(plugIn.editorName()));
-    const QString text =
-        QString("KOTAHub %1\n\nEditors: %2")
-            .arg(QApplication::applicationVersion(), editors.isEmpty() ? "none" : editors.join(", "));
-    screen_.showAbout("About KOTAHub", text, aboutPicture(editorPictures_));
+    const QString text = hubText(HubText::VersionAndEditors)
+                             .arg(QApplication::applicationVersion(),
+                                  editors.isEmpty() ? hubText(HubText::NoEditors) : editors.join(", "));
+    screen_.showAbout(hubText(HubText::About), text, aboutPicture(editorPictures_));
 }
 
 bool HubFrame::OpenRecent(UINT id, int notification) {

@@ -1,12 +1,18 @@
+#include "hub/screen/text.h"
 #include "hub/shell/hub_frame.h"
+#include "hub/shell/menu.h"
 #include "hub/shell/program_icon.h"
 #include "hub/shell/tour.h"
+#include "platform/language/language.h"
 
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QLibraryInfo>
 #include <QScreen>
 #include <QSettings>
 #include <QTemporaryDir>
+#include <QTextStream>
+#include <QTranslator>
 
 #include <functional>
 #include <memory>
@@ -14,6 +20,8 @@
 #include <utility>
 
 namespace {
+
+using kota::hub::QtScreen;
 
 constexpr QSize firstSize(1280, 800);
 constexpr QSize leastSize(640, 440);
@@ -39,9 +47,36 @@ private:
     std::function<void()> action_;
 };
 
-int runHub(const QStringList& files, const QString& tourFolder) {
+constexpr int english = 1033;
+constexpr int japanese = 1041;
+
+// What was asked for when the program was started, or else in its settings; 0 for the environment's.
+int wantedLanguage(const QString& asked) {
+    if (asked.isEmpty())
+        return QSettings().value("language", 0).toInt();
+    return asked == "ja" ? japanese : english;
+}
+
+// Has the program, the platform and the toolkit speak the user's language, and in letters that show it.
+void speak(int language, const QtScreen& screen, QTranslator& toolkitTexts) {
+    kota::setLanguage(language);
+    kota::hub::loadLanguage();
+    if (KhLangGetLanguage() != japanese)
+        return;
+    if (toolkitTexts.load("qtbase_ja", QLibraryInfo::path(QLibraryInfo::TranslationsPath)))
+        QCoreApplication::installTranslator(&toolkitTexts);
+    if (const CString face = screen.fontFor(japanese); !face.IsEmpty()) {
+        QFont font = QApplication::font();
+        font.setFamily(kota::hub::toQt(face));
+        QApplication::setFont(font);
+    }
+}
+
+int runHub(const QStringList& files, int language, const QString& tourFolder) {
     CWinApp application;
-    kota::hub::QtScreen screen;
+    QtScreen screen;
+    QTranslator toolkitTexts;
+    speak(language, screen, toolkitTexts);
     kota::Screen* const before = kota::attachScreen(&screen);
     int result = 0;
     {
@@ -91,6 +126,8 @@ int main(int argc, char** argv) {
     const QCommandLineOption tour("tour", "Play a short session on a copy of FILE and leave pictures of it.",
                                   "folder");
     options.addOption(tour);
+    const QCommandLineOption language("language", "Show texts in English (en) or Japanese (ja).", "en|ja");
+    options.addOption(language);
     options.addPositionalArgument("files", "The documents to open.", "[files...]");
     options.process(*application);
     const QTemporaryDir tourSettings; // the tour leaves the user's own alone
@@ -98,5 +135,10 @@ int main(int argc, char** argv) {
         QSettings::setDefaultFormat(QSettings::IniFormat);
         QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, tourSettings.path());
     }
-    return runHub(options.positionalArguments(), options.value(tour));
+    const QString asked = options.value(language);
+    if (!QStringList{"", "en", "ja"}.contains(asked)) {
+        QTextStream(stderr) << "There are no texts in '" << asked << "': en or ja is expected." << Qt::endl;
+        return 1;
+    }
+    return runHub(options.positionalArguments(), wantedLanguage(asked), options.value(tour));
 }

@@ -1,5 +1,6 @@
 #include "hub/shell/plug_ins.h"
 
+#include "hub/shell/menu.h"
 #include "platform/language/language.h"
 
 #include <QCoreApplication>
@@ -22,11 +23,12 @@ PlugIns loadPlugIns(const QString& folder) {
         try {
             plugIns.loaded.emplace_back(QFile::encodeName(file.absoluteFilePath()).toStdString());
         } catch (const std::runtime_error& error) {
-            plugIns.problems.append(QString("%1 could not be loaded: %2").arg(file.fileName(), error.what()));
+            plugIns.problems.append(
+                hubText(HubText::NotLoaded).arg(file.fileName(), QString::fromUtf8(error.what())));
         }
     }
     if (plugIns.loaded.empty() && plugIns.problems.empty())
-        plugIns.problems.append(QString("There is no editor in %1.").arg(folder));
+        plugIns.problems.append(hubText(HubText::NoEditorIn).arg(folder));
     return plugIns;
 }
 

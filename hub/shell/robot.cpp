@@ -88,14 +88,19 @@ Widget& Robot::visible(const char* what) const {
     throw missing(what);
 }
 
-void Robot::clickTab(const QString& caption) {
+void Robot::clickTab(int place) {
     auto& bar = visible<QTabBar>("row of tabs");
-    for (int i = 0; i < bar.count(); ++i)
-        if (bar.tabText(i) == caption) {
-            click(bar, bar.tabRect(i).center());
-            return;
-        }
-    throw missing("tab " + caption);
+    if (place >= bar.count())
+        throw missing(QString("tab %1").arg(place + 1));
+    click(bar, bar.tabRect(place).center());
+}
+
+QStringList Robot::tabs() const {
+    const auto& bar = visible<QTabBar>("row of tabs");
+    QStringList all;
+    for (int place = 0; place < bar.count(); ++place)
+        all.append(bar.tabText(place));
+    return all;
 }
 
 int Robot::lineCount() const {
@@ -109,30 +114,27 @@ void Robot::clickCell(int line, int column) {
     click(*grid.viewport(), grid.visualRect(cell).center());
 }
 
-void Robot::choose(const QString& menu, const QString& entry) {
-    for (const QAction* const popup : window_.menuBar()->actions()) {
-        if (QString(popup->text()).remove('&') != menu || !popup->isEnabled())
-            continue;
-        for (QAction* const action : popup->menu()->actions())
-            if (QString(action->text()).remove('&').section('\t', 0, 0) == entry && action->isEnabled()) {
-                action->trigger();
+void Robot::choose(UINT command) {
+    for (const QAction* const popup : window_.menuBar()->actions())
+        for (QAction* const entry : popup->menu()->actions())
+            if (entry->data().toUInt() == command && popup->isEnabled() && entry->isEnabled()) {
+                entry->trigger();
                 settle();
                 return;
             }
-    }
-    throw missing(menu + ", " + entry);
+    throw missing(QString("entry of the command %1").arg(command));
 }
 
-void Robot::fill(const QString& label, const QString& text) {
+void Robot::fill(int place, const QString& text) {
     for (QLineEdit* const line : window_.findChildren<QLineEdit*>()) {
-        if (!line->isVisible() || line->accessibleName() != label)
+        if (!line->isVisible() || --place > 0)
             continue;
         click(*line, line->rect().center());
         press(Qt::Key_A, Qt::ControlModifier);
         type(text);
         return;
     }
-    throw missing("field " + label);
+    throw missing("further field");
 }
 
 void Robot::answerNext(std::function<void(QWidget&)> answer) {

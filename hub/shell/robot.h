@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/framework/types.h"
+
 #include <QMainWindow>
 #include <QString>
 #include <QTimer>
@@ -20,15 +22,17 @@ public:
     // To the widget with the focus.
     void press(int key, Qt::KeyboardModifiers held = Qt::NoModifier);
     void type(const QString& text);
-    void clickTab(const QString& caption);
+    // A tab by its place, from 0.
+    void clickTab(int place);
+    QStringList tabs() const;
     // How many lines the grid in front has.
     int lineCount() const;
     // A cell of the grid in front, lines and columns from 1.
     void clickCell(int line, int column);
-    // An entry of the menu bar, by the texts without their "&".
-    void choose(const QString& menu, const QString& entry);
-    // Writes into the field of that label, in place of what it holds.
-    void fill(const QString& label, const QString& text);
+    // The entry of a command in the menu bar.
+    void choose(UINT command);
+    // Writes into a field of the page in front, counted from 1, in place of what it holds.
+    void fill(int place, const QString& text);
     // What the user does with the next box or dialog, once it is open. Call it before what opens the box.
     void answerNext(std::function<void(QWidget&)> answer);
     // The window as it is to be seen, with what stands in front of it.

@@ -2,12 +2,12 @@
 
 #include "hub/shell/robot.h"
 #include "platform/framework/document.h"
+#include "platform/framework/messages.h"
 
 #include <QAbstractButton>
 #include <QDir>
 #include <QFileInfo>
 #include <QMessageBox>
-#include <QTabBar>
 #include <QTextStream>
 
 #include <stdexcept>
@@ -15,6 +15,12 @@
 namespace kota::hub {
 
 namespace {
+
+// The places of tabs, and of a field of the dispersion tab.
+constexpr int components = 0;
+constexpr int dispersion = 1;
+constexpr int decay = 4;
+constexpr int minimumCoefficient = 3;
 
 class Tour {
 public:
@@ -59,23 +65,15 @@ private:
     }
 
     void visitTabs() {
-        const auto tabs = captions();
-        for (const QString& caption : tabs) {
-            robot_.clickTab(caption);
-            step("Tab " + caption);
+        const QStringList tabs = robot_.tabs();
+        for (int place = 0; place < tabs.size(); ++place) {
+            robot_.clickTab(place);
+            step("Tab " + tabs[place]);
         }
     }
 
-    QStringList captions() const {
-        QStringList all;
-        const auto* const bar = window_.findChild<QTabBar*>();
-        for (int i = 0; bar && i < bar->count(); ++i)
-            all.append(bar->tabText(i));
-        return all;
-    }
-
     void renameComponent() {
-        robot_.clickTab("Components");
+        robot_.clickTab(components);
         robot_.clickCell(1, 1);
         robot_.type("oxygen demand");
         step("A component gets another name");
@@ -84,7 +82,7 @@ private:
     }
 
     void insertDecayLine() {
-        robot_.clickTab("Decay");
+        robot_.clickTab(decay);
         robot_.clickCell(1, 2);
         robot_.press(Qt::Key_Insert);
         step("A decay line is inserted");
@@ -103,27 +101,27 @@ private:
     }
 
     void breachBounds() {
-        robot_.clickTab("Dispersion");
-        robot_.fill("Minimum disp. coefficient", "99999");
+        robot_.clickTab(dispersion);
+        robot_.fill(minimumCoefficient, "99999");
         robot_.answerNext([this](QWidget& box) {
             step("The minimum is above the maximum, and the tab stays");
             dynamic_cast<QMessageBox&>(box).buttons().first()->click();
         });
-        robot_.clickTab("Decay");
-        robot_.fill("Minimum disp. coefficient", "10");
+        robot_.clickTab(decay);
+        robot_.fill(minimumCoefficient, "10");
         step("The minimum is mended");
-        robot_.clickTab("Decay");
+        robot_.clickTab(decay);
     }
 
     void saveAndReopen() {
         robot_.press(Qt::Key_S, Qt::ControlModifier);
         expect(!frame_.MDIGetActive()->GetActiveDocument()->IsModified(), "the document was not saved");
         step("The document is saved");
-        robot_.choose("File", "Close");
+        robot_.choose(ID_FILE_CLOSE);
         expect(frame_.MDIGetActive() == nullptr, "the document did not close");
         step("The document is closed");
         open("The saved document is open again");
-        robot_.clickTab("Decay");
+        robot_.clickTab(decay);
         step("The inserted decay line is there again");
     }
 

@@ -1,5 +1,7 @@
 #include "platform/foundation/kept_file.h"
 
+#include "platform/framework/platform_texts.h"
+
 #include <cerrno>
 #include <cstdio>
 #include <memory>
@@ -91,7 +93,8 @@ void KeptFile::keep() {
     std::error_code failed;
     const fs::file_status inTheWay = fs::status(kept_, failed);
     if (fs::exists(inTheWay) && !fs::is_regular_file(inTheWay)) {
-        error_ = kept_.string() + " is not a file";
+        const CString problem = platformText(PlatformText::SomethingNotFile, kept_.c_str());
+        error_ = problem.View();
         return;
     }
     const fs::path copy = kept_.string() + ".part";

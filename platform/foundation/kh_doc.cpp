@@ -2,6 +2,7 @@
 
 #include "platform/foundation/kept_file.h"
 #include "platform/framework/message_box.h"
+#include "platform/framework/platform_texts.h"
 #include "platform/framework/screen.h"
 #include "platform/framework/template.h"
 #include "platform/kvs/kvs.h"
@@ -11,6 +12,7 @@
 #include <system_error>
 
 namespace fs = std::filesystem;
+using kota::PlatformText;
 
 namespace {
 
@@ -19,7 +21,7 @@ std::string unreadable(const char* path) {
     std::error_code failed;
     const fs::file_status status = fs::status(path, failed);
     if (fs::exists(status) && !fs::is_regular_file(status))
-        return "not a file";
+        return std::string(kota::platformText(PlatformText::NotAFile).View());
     errno = 0;
     if (std::ifstream(path).is_open())
         return {};
@@ -62,13 +64,13 @@ BOOL CKhDoc::OnOpenDocument(const char* path) {
     path = path ? path : "";
     CString message;
     if (const std::string reason = unreadable(path); !reason.empty()) {
-        message.Format("%s cannot be opened: %s.", path, reason.c_str());
+        message = kota::platformText(PlatformText::CannotOpen, path, reason.c_str());
         AfxMessageBox(message);
         return FALSE;
     }
     if (looksInterrupted(path)) {
-        message.Format("%s is empty: a save of it was interrupted. The version before is in %s.", path,
-                       kota::KeptFile::keptName(path).string().c_str());
+        message = kota::platformText(PlatformText::SaveInterrupted, path,
+                                     kota::KeptFile::keptName(path).string().c_str());
         AfxMessageBox(message);
     }
     DeleteContents();
@@ -108,8 +110,7 @@ bool CKhDoc::MayWriteInstead(const CString& named) const {
     const CDocument* const open = docTemplate ? docTemplate->FindOpen(written) : nullptr;
     CString question;
     if (open && open != this) {
-        question.Format("%s is open in another window. Close it there first.",
-                        static_cast<const char*>(written));
+        question = kota::platformText(PlatformText::OpenElsewhere, static_cast<const char*>(written));
         AfxMessageBox(question);
         return false;
     }
@@ -117,7 +118,7 @@ bool CKhDoc::MayWriteInstead(const CString& named) const {
     const bool isNamed = fs::equivalent(named.View(), written.View(), failed);
     if (written == named || isNamed || !fs::exists(written.View(), failed))
         return true;
-    question.Format("%s exists already. Do you want to replace it?", static_cast<const char*>(written));
+    question = kota::platformText(PlatformText::ReplaceFile, static_cast<const char*>(written));
     return AfxMessageBox(question, MB_YESNO) == IDYES;
 }
 
@@ -126,15 +127,15 @@ BOOL CKhDoc::SaveKeeping(const CString& path, CString& problem) {
     const CString written = WrittenPathName(path);
     kota::KeptFile old(static_cast<const char*>(written));
     if (!old.error().empty()) {
-        problem.Format("%s was not saved, since the version before could not be kept: %s.",
-                       static_cast<const char*>(written), old.error().c_str());
+        problem =
+            kota::platformText(PlatformText::NotKept, static_cast<const char*>(written), old.error().c_str());
         return FALSE;
     }
     kvsGetErrorGlb(); // what failed earlier is not this save's failure
     if (!OnSaveDocument(path))
         return FALSE;
     if (kvsPeekErrorGlb()) {
-        problem.Format("The document was not saved: %s.", static_cast<const char*>(kvsPeekErrorTextGlb()));
+        problem = kota::platformText(PlatformText::NotSaved, static_cast<const char*>(kvsPeekErrorTextGlb()));
         kvsGetErrorGlb();
         SetModifiedFlag(TRUE);
         return FALSE;

@@ -1,6 +1,7 @@
 #include "platform/foundation/plug_in.h"
 
 #include "platform/foundation/frames.h"
+#include "platform/framework/platform_texts.h"
 #include "platform/framework/template.h"
 
 #include <stdexcept>
@@ -9,13 +10,17 @@ namespace kota {
 
 namespace {
 
+template <class... Arguments>
+[[noreturn]] void refuse(PlatformText reason, const Arguments... arguments) {
+    throw std::runtime_error(static_cast<const char*>(platformText(reason, arguments...)));
+}
+
 void checkVersion(const std::string& path, HINSTANCE library) {
     const auto version = reinterpret_cast<int (*)()>(symbolOf(library, "_ZN4kota16plugInAbiVersionEv"));
     if (!version)
-        throw std::runtime_error(path + " is not a plug-in of this program");
+        refuse(PlatformText::NotAPlugIn, path.c_str());
     if (const int built = version(); built != abiVersion)
-        throw std::runtime_error(path + " was built for version " + std::to_string(built) +
-                                 " of the platform; this is version " + std::to_string(abiVersion));
+        refuse(PlatformText::BuiltForOther, path.c_str(), built, abiVersion);
 }
 
 } // namespace
@@ -30,7 +35,7 @@ PlugIn::PlugIn(const std::string& path) : path_(path) {
          {"KhGetNumDocTemplates", "KhGetDocTemplatePtr", "KhGetNumToolbars", "KhCreateToolbar",
           "KhInitToolbar", "KhGetBitmapId", "KhGetEditorString", "KhGetToolbarString"})
         if (!symbolOf(library_, name))
-            throw std::runtime_error(path_ + " does not export " + name);
+            refuse(PlatformText::DoesNotExport, path_.c_str(), name);
     templateCount_ = symbol<int()>("KhGetNumDocTemplates")();
     toolBarCount_ = symbol<int()>("KhGetNumToolbars")();
 }

@@ -4,6 +4,7 @@
 #include "platform/framework/frame.h"
 #include "platform/framework/message_box.h"
 #include "platform/framework/path.h"
+#include "platform/framework/platform_texts.h"
 #include "platform/framework/template.h"
 #include "platform/framework/turn.h"
 
@@ -82,7 +83,7 @@ CDocument* CWinApp::OpenDocumentFile(const char* path) {
 }
 
 void CWinApp::WinHelp(UINT /*context*/) {
-    AfxMessageBox("There is no help for this.");
+    AfxMessageBox(kota::platformText(kota::PlatformText::NoHelp));
 }
 
 CWinApp* AfxGetApp() {

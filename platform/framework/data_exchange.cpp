@@ -1,5 +1,7 @@
 #include "platform/framework/data_exchange.h"
 
+#include "platform/framework/platform_texts.h"
+
 #include <charconv>
 #include <vector>
 
@@ -53,7 +55,7 @@ void DDX_Text(CDataExchange* exchange, UINT id, int& value) {
     int number = 0;
     const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number);
     if (error != std::errc() || end != digits.data() + digits.size()) {
-        exchange->dialog->MessageBox("Please enter an integer.");
+        exchange->dialog->MessageBox(kota::platformText(kota::PlatformText::IntegerRequired));
         throw kota::ExchangeFailure();
     }
     value = number;

@@ -3,6 +3,7 @@
 #include "platform/framework/frame.h"
 #include "platform/framework/message_box.h"
 #include "platform/framework/path.h"
+#include "platform/framework/platform_texts.h"
 #include "platform/framework/template.h"
 #include "platform/framework/view.h"
 
@@ -155,8 +156,8 @@ BOOL CDocument::SaveModified() {
     if (!IsModified())
         return TRUE;
     CString question;
-    question.Format("Save changes to %s?",
-                    title_.IsEmpty() ? "the document" : static_cast<const char*>(title_));
+    const CString name = title_.IsEmpty() ? kota::platformText(kota::PlatformText::TheDocument) : title_;
+    question = kota::platformText(kota::PlatformText::SaveChanges, static_cast<const char*>(name));
     switch (AfxMessageBox(question, MB_YESNOCANCEL)) {
     case IDYES:
         return DoSave(pathName_);

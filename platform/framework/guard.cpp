@@ -2,6 +2,7 @@
 
 #include "platform/framework/exception.h"
 #include "platform/framework/message_box.h"
+#include "platform/framework/platform_texts.h"
 
 namespace kota {
 
@@ -10,8 +11,7 @@ bool guarded(const std::function<void()>& handler) {
         handler();
         return true;
     } catch (const CInvalidArgException& failure) {
-        CString text;
-        text.Format("An operation was given an invalid argument (%s).", failure.what());
+        const CString text = platformText(PlatformText::InvalidArgument, failure.what());
         AfxMessageBox(text);
         return false;
     }

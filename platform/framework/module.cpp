@@ -49,9 +49,4 @@ const BitmapResource* Module::icon(UINT id) const {
     return find(&Resources::icons, id);
 }
 
-const Module& platformModule() {
-    static const Module module("kota_platform", Resources{});
-    return module;
-}
-
 } // namespace kota

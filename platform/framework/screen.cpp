@@ -23,6 +23,9 @@ bool Screen::editText(UINT /*command*/, bool /*asked*/) {
 bool Screen::usesDecimalComma() const {
     return false;
 }
+CString Screen::fontFor(int /*language*/) const {
+    return {};
+}
 void Screen::windowsChanged(std::span<const WindowChange> /*changes*/) {}
 void Screen::changesPending() {}
 

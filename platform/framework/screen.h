@@ -56,6 +56,9 @@ public:
     virtual bool editText(UINT command, bool asked);
     // Whether the user writes numbers with a decimal comma; the base says no.
     virtual bool usesDecimalComma() const;
+    // The face of a font for the texts of a language (1041: Japanese); empty, as the base says, where the
+    // screen's own font shows them.
+    virtual CString fontFor(int language) const;
 
     // What changed, each window once, in the order in which the windows were first touched.
     virtual void windowsChanged(std::span<const WindowChange> changes);

@@ -122,10 +122,14 @@ int CString::Compare(const CString& other) const {
 void CString::Format(const char* format, ...) {
     va_list arguments;
     va_start(arguments, format);
+    FormatV(format, arguments);
+    va_end(arguments);
+}
+
+void CString::FormatV(const char* format, va_list arguments) {
     va_list again;
     va_copy(again, arguments);
     const int length = std::vsnprintf(nullptr, 0, format, arguments);
-    va_end(arguments);
     // Filled into a text of its own, since an argument may point into this one.
     std::string filled(length > 0 ? static_cast<std::size_t>(length) : 0, '\0');
     std::vsnprintf(filled.data(), filled.size() + 1, format, again);

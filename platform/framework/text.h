@@ -2,6 +2,7 @@
 
 #include "platform/framework/export.h"
 
+#include <cstdarg>
 #include <cstddef>
 #include <iosfwd>
 #include <string_view>
@@ -45,6 +46,7 @@ public:
 
     // Replaces the text by `format` filled in as the C library's printf does.
     [[gnu::format(printf, 2, 3)]] void Format(const char* format, ...);
+    [[gnu::format(printf, 2, 0)]] void FormatV(const char* format, std::va_list arguments);
 
 private:
     struct Bytes;

@@ -3,6 +3,7 @@
 #include "platform/framework/dialog.h"
 #include "platform/framework/document.h"
 #include "platform/framework/frame.h"
+#include "platform/framework/platform_texts.h"
 #include "platform/framework/tab_order.h"
 #include "platform/framework/turn.h"
 
@@ -42,7 +43,7 @@ BOOL CView::OnPreparePrinting(CPrintInfo* /*info*/) {
 }
 
 BOOL CView::DoPreparePrinting(CPrintInfo* /*info*/) {
-    MessageBox("Printing is not available.");
+    MessageBox(kota::platformText(kota::PlatformText::NoPrinting));
     return FALSE;
 }
 

@@ -1,13 +1,16 @@
 #include "platform/framework/message_box.h"
 #include "platform/framework/messages.h"
 #include "platform/framework/number_text.h"
+#include "platform/framework/platform_texts.h"
 #include "platform/framework/screen.h"
+#include "platform/grid/choice_list.h"
 #include "platform/grid/grid_data.h"
 #include "platform/grid/table_text.h"
 
 #include <algorithm>
 #include <string>
 
+using kota::PlatformText;
 using kota::grid::CellPlace;
 using kota::grid::TableLine;
 
@@ -17,24 +20,31 @@ namespace {
 class Refusals {
 public:
     void add(CellPlace place, const std::string& text, const CString& reason) {
-        if (++count_ <= mostTold)
-            told_ += "\nLine " + std::to_string(place.row) + ", column " + std::to_string(place.col) +
-                     ": \"" + text + "\" - " + std::string(reason.View());
+        if (++count_ > mostTold)
+            return;
+        const CString line = kota::platformText(PlatformText::RefusedValue, place.row, place.col,
+                                                text.c_str(), static_cast<const char*>(reason));
+        told_ += "\n" + line;
     }
     void tell() const {
         if (count_ == 0)
             return;
-        const std::string count = count_ == 1 ? "1 value" : std::to_string(count_) + " values";
-        const std::string rest =
-            count_ > mostTold ? "\nand " + std::to_string(count_ - mostTold) + " more" : std::string();
-        AfxMessageBox((count + " could not be pasted:\n" + told_ + rest).c_str());
+        CString all = kota::platformText(PlatformText::OneNotPasted);
+        if (count_ > 1)
+            all = kota::platformText(PlatformText::NotPasted, count_);
+        all += "\n" + told_;
+        if (count_ > mostTold) {
+            const CString rest = kota::platformText(PlatformText::MoreRefused, count_ - mostTold);
+            all += "\n" + rest;
+        }
+        AfxMessageBox(all);
     }
 
 private:
     static constexpr std::size_t mostTold = 10;
 
     std::size_t count_ = 0;
-    std::string told_;
+    CString told_;
 };
 
 // The same text with a decimal point, if it is one with a decimal comma for the user; else empty.
@@ -68,61 +78,79 @@ bool CGXGridCore::Data::hasWholeLines() const {
     });
 }
 
-// A choice is copied as its entry, all else as the value that the cell holds.
+// A choice is copied as its entry, unless another one reads the same, all else as the value that the cell
+// holds.
 std::string CGXGridCore::Data::copyOf(CellPlace place) const {
-    const bool isChoice = grid.GetControl(place.row, place.col)->Kind() == kota::CellKind::Choice;
-    return std::string(isChoice ? grid.GetDisplayText(place.row, place.col).View()
-                                : grid.CellText(place.row, place.col));
+    std::string value(grid.CellText(place.row, place.col));
+    if (grid.GetControl(place.row, place.col)->Kind() != kota::CellKind::Choice)
+        return value;
+    const CString entry = grid.GetDisplayText(place.row, place.col);
+    CGXStyle style;
+    grid.ComposeStyleRowCol(place.row, place.col, &style);
+    const CString list = style.GetChoiceList();
+    int same = 0;
+    kota::grid::findEntry(list.View(), [&](std::string_view other) {
+        same += other == entry.View() ? 1 : 0;
+        return false;
+    });
+    return same == 1 ? std::string(entry.View()) : value;
+}
+
+std::vector<CGXRange> CGXGridCore::Data::targets() const {
+    std::vector<CGXRange> ranges = {target()};
+    if (const auto& selected = param.GetRangeList()->Ranges(); selected.size() > 1) {
+        ranges.clear();
+        for (const CGXRange& range : selected)
+            ranges.push_back(existing(range));
+        std::ranges::sort(ranges, {}, &CGXRange::top);
+    }
+    std::erase_if(ranges, [](const CGXRange& range) { return range.kind == CGXRange::Kind::None; });
+    return ranges;
 }
 
 bool CGXGridCore::Data::copy() const {
-    std::vector<CGXRange> ranges = {target()};
-    if (const auto& selected = param.GetRangeList()->Ranges(); selected.size() > 1) {
-        ranges = selected;
-        std::ranges::sort(ranges, {}, &CGXRange::top);
-    }
     std::vector<TableLine> lines;
-    for (const CGXRange& selected : ranges) {
-        const CGXRange range = existing(selected);
-        for (ROWCOL row = range.top; row <= range.bottom && range.kind != CGXRange::Kind::None; ++row) {
+    for (const CGXRange& range : targets())
+        for (ROWCOL row = range.top; row <= range.bottom; ++row) {
             TableLine& line = lines.emplace_back();
             for (ROWCOL col = range.left; col <= range.right; ++col)
                 line.push_back(copyOf({row, col}));
         }
-    }
     kota::Screen* const screen = kota::attachedScreen();
     if (!screen || lines.empty())
         return false;
-    const bool isOneCell = lines.size() == 1 && lines.front().size() == 1;
-    const std::string text = kota::grid::printTable(lines);
-    screen->setClipboardText(isOneCell ? lines.front().front().c_str() : text.c_str());
+    const std::string& first = lines.front().front();
+    const bool isPlainValue = kota::grid::readTable(first) == lines;
+    screen->setClipboardText(isPlainValue ? first.c_str() : kota::grid::printTable(lines).c_str());
     return true;
 }
 
+// Lines in several pieces are not deleted, so they are not cut either.
 bool CGXGridCore::Data::cut() {
-    if (!copy())
+    const std::vector<CGXRange> ranges = targets();
+    if ((hasWholeLines() && ranges.size() > 1) || !copy())
         return false;
     if (hasWholeLines()) {
         grid.DeleteSelection();
         return true;
     }
-    const CGXRange range = target();
     CString ignored; // what cannot be blank stays
-    for (ROWCOL row = range.top; row <= range.bottom; ++row)
-        for (ROWCOL col = range.left; col <= range.right; ++col)
-            put({row, col}, "", ignored);
-    commitAt({range.top, range.left});
+    for (const CGXRange& range : ranges)
+        for (ROWCOL row = range.top; row <= range.bottom; ++row)
+            for (ROWCOL col = range.left; col <= range.right; ++col)
+                put({row, col}, "", ignored);
+    commitAt({ranges.front().top, ranges.front().left});
     return true;
 }
 
 // Puts a text into a cell as if it were typed. False when it is refused, with the reason.
 bool CGXGridCore::Data::put(CellPlace place, const std::string& text, CString& reason) {
     if (!canChange(place)) {
-        reason = "the cell cannot be changed";
+        reason = kota::platformText(PlatformText::CellIsReadOnly);
         return text.empty() || text == copyOf(place);
     }
     if (grid.GetControl(place.row, place.col)->Kind() == kota::CellKind::CheckBox) {
-        reason = "0 or 1 required";
+        reason = kota::platformText(PlatformText::ZeroOrOne);
         if (text != "0" && text != "1")
             return false;
         if ((kota::textToInt(cells.text(place.row, place.col)) != 0) != (text == "1"))
@@ -130,7 +158,7 @@ bool CGXGridCore::Data::put(CellPlace place, const std::string& text, CString& r
         return true;
     }
     if (!grid.OnStartEditing(place.row, place.col) || !canChange(place)) {
-        reason = "the cell cannot be changed";
+        reason = kota::platformText(PlatformText::CellIsReadOnly);
         return false;
     }
     return putText(place, text, reason);
@@ -140,7 +168,7 @@ bool CGXGridCore::Data::putText(CellPlace place, const std::string& text, CStrin
     openEdit(place);
     if (!edit.control->TakePasted(text.c_str())) {
         endEdit();
-        reason = "not one of the choices";
+        reason = kota::platformText(PlatformText::NotAChoice);
         return false;
     }
     textChanged();
@@ -167,9 +195,9 @@ bool CGXGridCore::Data::paste(std::vector<TableLine> lines) {
     if (isOneValue && (range.bottom > range.top || range.right > range.left))
         lines.assign(range.bottom - range.top + 1,
                      TableLine(range.right - range.left + 1, lines.front().front()));
+    const HWND window = grid.GetSafeHwnd();
     while (grid.GetRowCount() < start.row + lines.size() - 1 && grid.AppendLine()) {
     }
-    const HWND window = grid.GetSafeHwnd();
     Refusals refusals;
     CellPlace place = start;
     for (const TableLine& line : lines) {
@@ -189,11 +217,11 @@ bool CGXGridCore::Data::paste(std::vector<TableLine> lines) {
 
 bool CGXGridCore::Data::pasteCell(CellPlace place, const std::string& text, CString& reason) {
     if (place.col > grid.GetColCount()) {
-        reason = "there is no such column";
+        reason = kota::platformText(PlatformText::NoSuchColumn);
         return false;
     }
     if (place.row > grid.GetRowCount()) {
-        reason = "there is no such line";
+        reason = kota::platformText(PlatformText::NoSuchLine);
         return false;
     }
     return put(place, text, reason);
@@ -213,6 +241,8 @@ bool CGXGridCore::Data::editCommand(UINT id, bool asked) {
     if (asked)
         return target().kind != CGXRange::Kind::None;
     if (!grid.SetCurrentCell(current.row, current.col, GX_KEEPFOCUS) || grid.IsEditPending())
+        return false;
+    if (!grid.IsWindowVisible()) // whoever was told of the edit has brought another page to the front
         return false;
     switch (id) {
     case ID_EDIT_COPY:

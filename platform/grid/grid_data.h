@@ -68,6 +68,7 @@ struct CGXGridCore::Data {
     std::optional<CellPlace> placeBeside(CellPlace start, int direction, int count) const;
     void extendSelection(int direction);
     CGXRange target() const;
+    std::vector<CGXRange> targets() const; // of a copy, from the top
     bool hasWholeLines() const;
     std::string copyOf(CellPlace place) const;
     bool copy() const;

@@ -61,10 +61,8 @@ void CGXGridCore::Data::openEdit(CellPlace place) {
     CGXControl* const control = grid.GetControl(place.row, place.col);
     control->Init(place.row, place.col);
     control->SetModify(false);
-    edit = {.control = control,
-            .place = place,
-            .gesture = kota::turnNumber(),
-            .textBefore = control->GetCurrentText()};
+    edit = {
+        .control = control, .place = place, .gesture = gesture(), .textBefore = control->GetCurrentText()};
     ++edits;
     note(&kota::GridChanges::editing);
 }

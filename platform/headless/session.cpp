@@ -4,13 +4,16 @@
 #include "platform/framework/document.h"
 #include "platform/framework/template.h"
 #include "platform/framework/turn.h"
+#include "platform/language/language.h"
 
 #include <cstdio>
 #include <cstdlib>
+#include <filesystem>
 
 namespace kota::headless {
 
 Session::Session(std::function<void(const std::string&)> fail) : fail_(std::move(fail)), screen_(fail_) {
+    loadPlatformTexts();
     mainWindow_.Create({.parent = nullptr, .kind = WindowKind::Frame});
     application_.SetMainWnd(&mainWindow_);
     screenBefore_ = attachScreen(&screen_);
@@ -24,6 +27,7 @@ Session::~Session() {
 }
 
 void Session::load(const std::string& path) {
+    addLanguageFolder((std::filesystem::path(path).parent_path() / "languages").c_str());
     const PlugIn plugIn(path);
     for (auto& docTemplate : plugIn.makeTemplates())
         application_.AddDocTemplate(std::move(docTemplate));

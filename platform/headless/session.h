@@ -33,10 +33,11 @@ public:
     ScriptedScreen& screen() { return screen_; }
     Application& application() { return application_; }
 
-    // Makes the templates and the tool bars of a plug-in known; see PlugIn.
+    // Makes the templates and the tool bars of a plug-in known; see PlugIn. Its language libraries stand in
+    // the folder `languages` beside it.
     void load(const std::string& path);
     const std::vector<std::unique_ptr<CKhToolBarEx>>& toolBars() const { return toolBars_; }
-    // Null when that failed; the user was told why in a box.
+    // Null when that failed; the user was told why in a box, unless no editor is for such files.
     CDocument* open(const std::string& path);
     // A new document of the first template.
     CDocument* create();

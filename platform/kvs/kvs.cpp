@@ -1,5 +1,6 @@
 #include "platform/kvs/kvs.h"
 
+#include "platform/framework/platform_texts.h"
 #include "platform/kvs/reader.h"
 #include "platform/kvs/text_file.h"
 #include "platform/kvs/writer.h"
@@ -44,7 +45,8 @@ LoadError load(const std::string& path, std::optional<kota::kvs::Tree>& tree) {
         const std::string place = std::to_string(syntax.line) + ":" + std::to_string(syntax.column);
         return {syntax.line, syntax.column, path + ":" + place + ": " + syntax.what()};
     } catch (const std::bad_alloc&) {
-        return {0, 0, path + ": not enough memory to read it"};
+        const CString message = kota::platformText(kota::PlatformText::NoMemoryToRead, path.c_str());
+        return {0, 0, std::string(message.View())};
     }
 }
 

@@ -14,7 +14,8 @@
 // its place, from 1. The text form of a file is told in docs/file-format.md.
 //
 // Handles are opaque. What is asked of a null handle, or for something that is not there, gives null or the
-// value's zero, and what is added to a null handle goes nowhere; neither is a failure. A handle other than a
+// value's zero (kvsGetListParam leaves its address alone instead), and what is added to a null handle goes
+// nowhere; neither is a failure. A handle other than a
 // file's belongs to its file and dies with it. Nothing here is meant for more than one thread.
 
 namespace kota::kvs {
@@ -118,6 +119,7 @@ void kvsPutListParam(void* file, const char* keyword, const char* format, Value.
 }
 
 // Appends the text of what was built to the file at `path`, all or nothing; what is still open is closed
-// first. Gives 1, or 0 with the global error state set: the file cannot be written (it then is as it was), or
-// something was added where the form has no place for it. Clears the error of an earlier call.
+// first. Gives 1, 0 for a null handle, or 0 with the global error state set: the file cannot be written (it
+// then is as it was), or something was added where the form has no place for it. Clears the error of an
+// earlier call.
 KOTA_API int kvsAppend(void* file, const char* path);

@@ -21,7 +21,7 @@ private:
     void open(const std::string& name);
     void readKeyword(std::string_view name);
     void readParameter();
-    std::string_view name(const char* expected);
+    std::string_view name(PlatformText expected);
 
     Tree& tree_;
     Scanner text_;
@@ -49,7 +49,7 @@ void Reader::readTarget() {
     if (text_.word() != targetWord)
         text_.fail("'target'", start);
     text_.skipSpace();
-    open(std::string(name("the target's name")));
+    open(std::string(name(PlatformText::TargetName)));
 }
 
 // A section or, below a target's own level, a keyword. A word that '=' follows is always a keyword's name.
@@ -57,13 +57,14 @@ void Reader::readMember() {
     const char* start = text_.here();
     const bool inTarget = depth_ == 1;
     const bool plain = text_.peek() != '"';
-    const std::string_view first = name(inTarget ? "'section' or '}'" : "'section', a keyword's name or '}'");
+    const std::string_view first =
+        name(inTarget ? PlatformText::SectionOrEnd : PlatformText::SectionKeywordOrEnd);
     text_.skipBlanks();
     if (plain && first == sectionWord && text_.peek() != '=') {
         text_.skipSpace();
-        open(std::string(name("the section's name")));
+        open(std::string(name(PlatformText::SectionName)));
     } else if (inTarget) {
-        text_.fail("'section' or '}'", start);
+        text_.fail(PlatformText::SectionOrEnd, start);
     } else {
         readKeyword(first);
     }
@@ -74,8 +75,10 @@ void Reader::open(const std::string& name) {
     text_.skipSpace();
     if (text_.peek() != '{')
         text_.fail("'{'");
-    if (depth_ == deepestNesting)
-        text_.fail("at most " + std::to_string(deepestNesting) + " braces in each other");
+    if (depth_ == deepestNesting) {
+        const CString most = platformText(PlatformText::MostBraces, deepestNesting);
+        text_.fail(static_cast<const char*>(most));
+    }
     text_.skip();
     open_[depth_ + 1] = tree_.addSection(open_[depth_], name);
     ++depth_;
@@ -98,7 +101,7 @@ void Reader::readKeyword(std::string_view name) {
         text_.skipSpace();
     }
     if (!text_.atLineEnd() && text_.peek() != '}')
-        text_.fail("',' or the end of the line");
+        text_.fail(PlatformText::CommaOrEndOfLine);
 }
 
 void Reader::readParameter() {
@@ -108,7 +111,7 @@ void Reader::readParameter() {
         tree_.addParameter(text_.atWord() ? text_.wordValue() : text_.number());
 }
 
-std::string_view Reader::name(const char* expected) {
+std::string_view Reader::name(PlatformText expected) {
     if (text_.peek() == '"')
         return text_.quoted();
     const std::string_view plain = text_.word();

@@ -56,8 +56,6 @@ constexpr int hexDigit(char c) {
 constexpr std::array powersOfTen = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
                                     1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
 
-constexpr const char* aValue = "a value (a number, true, false, nan, inf, -inf or a string in double quotes)";
-
 } // namespace
 
 Scanner::Scanner(const ByteSource& source) : buffer_(source) {
@@ -116,7 +114,7 @@ std::string_view Scanner::quoted() {
     decoded_.assign(start, at);
     while (*at_ != '"') {
         if (*at_ == '\n' || atEnd())
-            fail("'\"' to close the string");
+            fail(PlatformText::ClosingQuote);
         decoded_ += *at_ == '\\' ? escape() : *at_++;
     }
     ++at_;
@@ -147,7 +145,7 @@ char Scanner::escape() {
     default:
         break;
     }
-    fail(R"(one of \" \\ \n \r \t and \x with two hexadecimal digits)", start);
+    fail(PlatformText::KnownEscape, start);
 }
 
 Cell Scanner::wordValue() {
@@ -159,7 +157,7 @@ Cell Scanner::wordValue() {
         return Cell::ofDouble(std::numeric_limits<double>::quiet_NaN());
     if (text == "inf")
         return Cell::ofDouble(std::numeric_limits<double>::infinity());
-    fail(aValue, start);
+    fail(PlatformText::Value, start);
 }
 
 Cell Scanner::number() {
@@ -170,10 +168,10 @@ Cell Scanner::number() {
     if (negative && is(*at_, NameStart)) {
         if (word() == "inf")
             return Cell::ofDouble(-std::numeric_limits<double>::infinity());
-        fail(aValue, start);
+        fail(PlatformText::Value, start);
     }
     if (!isDigit(*at_) && *at_ != '.')
-        fail(aValue, start);
+        fail(PlatformText::Value, start);
 
     // The digits as one whole number, which is right for up to 19 of them and exact in a double up to 2^53.
     constexpr std::size_t mostDigits = 19;
@@ -215,13 +213,13 @@ Cell Scanner::longNumber(const char* start) {
     double value = 0;
     const auto [stop, error] = std::from_chars(start, end_, value);
     if (error == std::errc::invalid_argument)
-        fail(aValue, start);
+        fail(PlatformText::Value, start);
     if (*stop == 'e' || *stop == 'E')
-        fail("digits behind the exponent's 'e'", start);
+        fail(PlatformText::ExponentDigits, start);
     if (std::all_of(start, stop, [](char c) { return c == '-' || isDigit(c); }))
-        fail("a whole number from -2147483648 to 2147483647, or a number with a point", start);
+        fail(PlatformText::WholeNumber, start);
     if (error == std::errc::result_out_of_range)
-        fail("a number within the range of a double, or inf", start);
+        fail(PlatformText::NumberInRange, start);
     at_ = stop;
     endOfNumber();
     return Cell::ofDouble(value);
@@ -229,21 +227,22 @@ Cell Scanner::longNumber(const char* start) {
 
 void Scanner::endOfNumber() {
     if (!is(*at_, BehindValue) || (*at_ == '\0' && !atEnd()))
-        fail("',' or the end of the line");
+        fail(PlatformText::CommaOrEndOfLine);
 }
 
-void Scanner::fail(const std::string& expected, const char* where) const {
+void Scanner::fail(const char* expected, const char* where) const {
     int column = 1;
     for (const char* c = lineStart_; c < where; c += std::max(1, utf8Length({c, where})))
         ++column;
-    throw SyntaxError(line_, column, "expected " + expected + ", found " + found(where));
+    const CString message = platformText(PlatformText::SyntaxError, expected, found(where).c_str());
+    throw SyntaxError(line_, column, static_cast<const char*>(message));
 }
 
 std::string Scanner::found(const char* where) const {
     if (where == end_)
-        return "the end of the file";
+        return std::string(platformText(PlatformText::EndOfFile).View());
     if (*where == '\n')
-        return "the end of the line";
+        return std::string(platformText(PlatformText::EndOfLine).View());
     constexpr std::string_view apart = " \t\r\n,#{}=\"";
     constexpr std::ptrdiff_t longest = 32;
     const char* const stop = end_ - where > longest ? where + longest : end_;

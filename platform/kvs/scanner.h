@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/framework/platform_texts.h"
 #include "platform/kvs/cell.h"
 #include "platform/kvs/line_buffer.h"
 
@@ -46,8 +47,13 @@ public:
 
     // A place of the line in memory, for an error that is seen further on.
     const char* here() const { return at_; }
-    [[noreturn]] void fail(const std::string& expected) const { fail(expected, at_); }
-    [[noreturn]] void fail(const std::string& expected, const char* where) const;
+    // What had to stand here, or there.
+    [[noreturn]] void fail(PlatformText expected) const { fail(expected, at_); }
+    [[noreturn]] void fail(PlatformText expected, const char* where) const {
+        fail(static_cast<const char*>(platformText(expected)), where);
+    }
+    [[noreturn]] void fail(const char* expected) const { fail(expected, at_); }
+    [[noreturn]] void fail(const char* expected, const char* where) const;
 
 private:
     void nextLine(const char* at);

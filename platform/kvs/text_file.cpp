@@ -1,5 +1,7 @@
 #include "platform/kvs/text_file.h"
 
+#include "platform/framework/platform_texts.h"
+
 #include <cerrno>
 #include <cstdio>
 #include <filesystem>
@@ -21,6 +23,10 @@ using OpenFile = std::unique_ptr<std::FILE, CloseFile>;
 
 std::string reasonFor(const fs::path& path, const std::string& reason) {
     return path.string() + ": " + reason;
+}
+
+std::string reasonFor(const fs::path& path, PlatformText reason) {
+    return reasonFor(path, std::string(platformText(reason).View()));
 }
 
 std::string reasonFor(const fs::path& path, int error) {
@@ -73,13 +79,15 @@ std::string InputFile::open(const char* path) {
     std::error_code failed;
     const fs::file_status status = fs::status(path, failed);
     if (fs::exists(status) && !fs::is_regular_file(status))
-        return reasonFor(path, "not a file");
+        return reasonFor(path, PlatformText::NotAFile);
     file_.reset(std::fopen(path, "rb"));
     if (!file_)
         return reasonFor(path, errno);
     const std::uintmax_t size = fs::file_size(path, failed);
-    if (failed || size > largestFile)
-        return reasonFor(path, failed ? failed.message() : "larger than 4 GiB");
+    if (failed)
+        return reasonFor(path, failed.message());
+    if (size > largestFile)
+        return reasonFor(path, PlatformText::TooLarge);
     size_ = size;
     std::setvbuf(file_.get(), nullptr, _IONBF, 0);
     return {};

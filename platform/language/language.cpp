@@ -1,11 +1,16 @@
 #include "platform/language/language.h"
 
+#include "platform/framework/platform_texts.h"
+#include "platform/framework/screen.h"
+
 #include <dlfcn.h>
 
+#include <algorithm>
 #include <cstdlib>
 #include <filesystem>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace {
@@ -48,7 +53,14 @@ void kota::setLanguage(int language) {
     chosenLanguage() = language;
 }
 void kota::addLanguageFolder(const char* folder) {
-    folders().emplace_back(folder);
+    if (std::ranges::find(folders(), folder) == folders().end())
+        folders().emplace_back(folder);
+}
+
+void kota::loadPlatformTexts() {
+    AFX_EXTENSION_MODULE& record = platformRecord();
+    FreeLibrary(std::exchange(record.resources, nullptr));
+    KhLangLoadResDll("kota_platform", &record.resources, 0);
 }
 
 HINSTANCE KhLangLoadResDll(const char* base, HINSTANCE* resources, int /*flags*/) {
@@ -74,4 +86,7 @@ BOOL SystemParametersInfo(UINT action, NONCLIENTMETRICS& metrics) {
 
 void KhLangGetUserFont(const NONCLIENTMETRICS& metrics, LOGFONT* font) {
     *font = metrics.message;
+    const kota::Screen* const screen = kota::attachedScreen();
+    if (const CString face = screen ? screen->fontFor(KhLangGetLanguage()) : CString(); !face.IsEmpty())
+        font->face = face;
 }

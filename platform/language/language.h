@@ -26,8 +26,11 @@ KOTA_API BOOL SystemParametersInfo(UINT action, NONCLIENTMETRICS& metrics);
 KOTA_API int KhLangGetLanguage();
 namespace kota {
 KOTA_API void setLanguage(int language);
-// A further folder where language libraries are looked for, behind that of the platform itself.
+// A further folder where language libraries are looked for, behind that of the platform itself. Once is
+// enough.
 KOTA_API void addLanguageFolder(const char* folder);
+// Has the platform speak the user's language from now on. The shell calls it once it has set the language.
+KOTA_API void loadPlatformTexts();
 } // namespace kota
 
 // Loads the language library of an extension library, libBASE_LANGUAGE.so, and stores its handle in
@@ -35,5 +38,6 @@ KOTA_API void addLanguageFolder(const char* folder);
 // none. `flags` is 0.
 KOTA_API HINSTANCE KhLangLoadResDll(const char* base, HINSTANCE* resources, int flags);
 
-// The font that shows texts of the user's language: the message font of `metrics`.
+// The font for texts of the user's language: the message font of `metrics`, or in its place one that the
+// screen has for that language.
 KOTA_API void KhLangGetUserFont(const NONCLIENTMETRICS& metrics, LOGFONT* font);

@@ -199,6 +199,27 @@ INSTANTIATE_TEST_SUITE_P(FromAnyMessage, AShellThatCallsBackIn,
                                     std::get<1>(given.param).name;
                          });
 
+TEST_F(DocumentWindow, APasteGoesToNoPageThatTheShellHasPutAway) {
+    openProject();
+    CKota0_adDoc& document = createDispersion();
+    User user(session);
+    user.putCursor(1, 1);
+    user.type("JAMES");
+    session.screen().setClipboardText("OHIO\t1\nNILE\t2\n");
+    shell().onMessage = [&](const Received& message) {
+        if (message.code == 523)
+            user.selectTab("Decay");
+    };
+
+    user.command(ID_EDIT_PASTE);
+
+    EXPECT_EQ(user.tab(), "Decay");
+    EXPECT_EQ(recordOf(document.dispersList, 1).riverName, "JAMES");
+    EXPECT_EQ(recordOf(document.dispersList, 2).riverName, "PLATTE");
+    user.selectTab("Dispersion");
+    EXPECT_EQ(user.held(2, 1), "PLATTE");
+}
+
 // What a shell may do to a document whose last view is on its way out.
 class TheLastMessagesOfAView : public DocumentWindow {
 protected:

@@ -170,7 +170,7 @@ TEST_F(Insertion, CommitsTheEditThatIsUnderWay) {
     EXPECT_TRUE(document.IsModified());
 }
 
-TEST_F(Insertion, OfTheProbeIsInNoMenuAndDoesNoHarm) {
+TEST_F(Insertion, OfTheProbeDoesNoHarm) {
     CKota0_adDoc& document = createDispersion();
 
     EXPECT_TRUE(User(session).command(CommandId::InsertProbe));

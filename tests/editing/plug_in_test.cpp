@@ -25,7 +25,7 @@ TEST(PlugIn, MakesANewTemplateForEachCall) {
     EXPECT_NE(second, third);
 }
 
-TEST(PlugIn, TiesDocumentFrameAndViewTogether) {
+TEST(PlugIn, IsForDocumentsOfItsOwnClass) {
     const std::unique_ptr<CMultiDocTemplate> docTemplate(KhGetDocTemplatePtr(0));
 
     EXPECT_EQ(docTemplate->Id(), 4787U);

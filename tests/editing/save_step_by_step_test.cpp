@@ -26,6 +26,7 @@ TEST_F(ASave, StoresCleansRefreshesAndWrites) {
     CKota0_adDoc& document = open(folder.write("river.ad31", "target KOTA0_AD {\n}\n"));
     addDispersion(document, "MISSOURI", 1000.0);
     addDispersion(document, "PLATTE", notGiven);
+    addDispersion(document, "", 2000.0);
     addLocal(document.boundList, 1, "KANSAS", 5.0);
     User user(session);
     user.selectTab("Dispersion");
@@ -39,7 +40,7 @@ TEST_F(ASave, StoresCleansRefreshesAndWrites) {
     EXPECT_TRUE(user.command(ID_FILE_SAVE));
 
     EXPECT_THAT(witness.hints(), ElementsAre(2, 1, 2)) << "the edit's own, store, and fill";
-    EXPECT_EQ(countAtHint.at(1), 2U) << "hint 1 comes before the lines are dropped";
+    EXPECT_EQ(countAtHint.at(1), 3U) << "hint 1 comes before the lines are dropped";
     EXPECT_EQ(countAtHint.at(2), 1U) << "hint 2 comes after";
     EXPECT_THAT(riversOf(document), ElementsAre("MISSOURI"));
     EXPECT_EQ(user.grid().GetRowCount(), 1U) << "the view shows what is left";
@@ -53,6 +54,26 @@ TEST_F(ASave, StoresCleansRefreshesAndWrites) {
     EXPECT_EQ(folder.read("river.ad31"), "target KOTA0_AD {\n}\n") << "another file, which stays";
     EXPECT_THAT(boxes(), IsEmpty());
     document.RemoveView(&witness);
+}
+
+// The page of a section of a file, as it stands there.
+std::string sectionOf(const std::string& file, const std::string& name) {
+    const std::size_t start = file.find("  section " + name + " {");
+    return file.substr(start, file.find("\n  }\n", start) - start);
+}
+
+TEST_F(ASave, KeepsTheGlobalValuesThatNoPageShows) {
+    const std::string before = readFile(KOTA_TEST_DATA "/good/everything.becomes.AD31");
+    CKota0_adDoc& document = open(folder.write("river.AD31", before));
+    User user(session);
+    for (const char* tab : {"Components", "Dispersion", "KOTA 32 Dispersion", "Decay", "Sediment Layers"})
+        ASSERT_TRUE(user.selectTab(tab)) << tab;
+
+    ASSERT_TRUE(session.save(document));
+
+    ASSERT_FALSE(sectionOf(before, "Global_Variables").empty());
+    EXPECT_EQ(sectionOf(folder.read("river.AD31"), "Global_Variables"),
+              sectionOf(before, "Global_Variables"));
 }
 
 TEST_F(ASave, IsRefusedWithWordsWhereGlobalsAreMissing) {

@@ -47,6 +47,9 @@ TEST(PackageItem, NamesWhatItStandsForByANumber) {
 TEST(PackageMessages, AreTheOnesRegisteredByTheirNames) {
     EXPECT_EQ(communicationMessage(), RegisterWindowMessage("KOTAHubCommunicationBetweenEditors"));
     EXPECT_EQ(switchBoardMessage(), RegisterWindowMessage("KOTAHubSwitchBoardSevice"));
+    EXPECT_EQ(projectMessage(), RegisterWindowMessage("KOTAHubProjectManagement"));
+    EXPECT_EQ(showToolbarMessage(), RegisterWindowMessage("KOTAHubShowToolbar"));
+    EXPECT_EQ(hideToolbarMessage(), RegisterWindowMessage("KOTAHubHideToolbar"));
     EXPECT_NE(communicationMessage(), switchBoardMessage());
 }
 

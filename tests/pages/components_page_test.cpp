@@ -1,3 +1,5 @@
+#include "platform/framework/property_sheet.h"
+#include "platform/framework/turn.h"
 #include "tests/pages/tabs.h"
 
 namespace {
@@ -91,6 +93,17 @@ TEST_F(TheComponentsPage, TakesANameThatIsStillBeingTypedWhenItIsLeft) {
     ASSERT_TRUE(user->type("oxygen"));
     leaveTab();
     EXPECT_THAT(names(), ElementsAre("OXYGEN"));
+}
+
+TEST_F(TheComponentsPage, TakesTheCellAgainAndBringsItIntoViewWhenItIsKilled) {
+    ASSERT_TRUE(user->putCursor(1, 1));
+    ASSERT_TRUE(user->type("oxygen"));
+    const kota::Turn turn;
+
+    EXPECT_TRUE(static_cast<CPropertyPage&>(user->page()).OnKillActive());
+
+    EXPECT_EQ(user->held(1, 1), "OXYGEN");
+    EXPECT_EQ(user->cursor(), (std::pair<ROWCOL, ROWCOL>(1, 1)));
 }
 
 TEST_F(TheComponentsPage, StoresUnitsFromOneAndTypesFromZero) {

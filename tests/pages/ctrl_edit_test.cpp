@@ -3,7 +3,18 @@
 #include "platform/framework/message_box.h"
 #include "platform/headless/session.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
+
+namespace {
+
+std::vector<UINT> relayed;
+
+} // namespace
+
+// Stands before the platform's for all libraries.
+void CToolTipCtrl::RelayEvent(MSG* message) {
+    relayed.push_back(message->message);
+}
 
 namespace {
 
@@ -76,6 +87,16 @@ TEST_F(AnEditOfANumber, GoesOnWithAnotherOneWhenItIsSetUpAgain) {
     EXPECT_TRUE(enter("8"));
     EXPECT_EQ(next, 8.0);
     EXPECT_EQ(number, 0.5);
+}
+
+TEST_F(AnEditOfANumber, HasItsToolTipFollowTheMouse) {
+    edit.Setup(&number, 20, 1, true, layerHeight, usersUnit);
+    relayed.clear();
+
+    for (const UINT message : {WM_MOUSEMOVE, WM_LBUTTONDOWN, WM_KEYDOWN, WM_LBUTTONUP})
+        edit.SendMessage(message);
+
+    EXPECT_THAT(relayed, testing::ElementsAre(WM_MOUSEMOVE, WM_LBUTTONDOWN, WM_LBUTTONUP));
 }
 
 TEST_F(AnEditOfANumber, KeepsItForAnEmptyText) {

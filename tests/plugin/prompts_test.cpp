@@ -16,9 +16,9 @@ TEST_F(Prompts, AreTheDocumentsInFront) {
 
     EXPECT_EQ(promptOf(42550), "Search for river name/topo ID.\nSearch");
     EXPECT_EQ(promptOf(42551), "Search for next occurence of river name/ topo ID.\nFind Next");
-    EXPECT_FALSE(promptOf(42561).IsEmpty());
-    EXPECT_FALSE(promptOf(42562).IsEmpty());
-    EXPECT_FALSE(promptOf(42563).IsEmpty());
+    EXPECT_EQ(promptOf(42561), "Insert line into local variable grid.");
+    EXPECT_EQ(promptOf(42562), "Delete line from grid.");
+    EXPECT_EQ(promptOf(42563), "Go to line with specified number.");
 }
 
 TEST_F(Prompts, OfADocumentsCommandsAreEmptyWithoutADocument) {

@@ -210,6 +210,46 @@ TEST_F(Clipboard, IsPastedInOneStep) {
     EXPECT_FALSE(grid.CanUndo());
 }
 
+TEST_F(Clipboard, IsPastedInOneStepWithTheEditThatItEnds) {
+    grid.goTo(4, 1);
+    user::typeText(grid, "12");
+
+    paste("7\n8\n");
+
+    ASSERT_EQ(grid.GetRowCount(), 5U);
+    const kota::Turn turn;
+    EXPECT_TRUE(grid.Undo());
+    EXPECT_EQ(grid.GetRowCount(), 4U);
+    EXPECT_EQ(grid.text(4, 1), "4");
+    EXPECT_FALSE(grid.CanUndo());
+}
+
+TEST_F(Clipboard, TakesAChoiceByItsNumberWhereAnotherEntryReadsTheSame) {
+    grid.SetStyleRange(CGXRange().SetCols(2), CGXStyle().SetChoiceList("A\nB\nA\n"));
+    grid.write(1, 2, "2");
+    grid.write(2, 2, "1");
+    user::selectCells(grid, CGXRange(1, 2, 2, 2));
+    ASSERT_TRUE(run(ID_EDIT_COPY));
+    EXPECT_EQ(clipboard(), "2\nB\n");
+
+    user::selectCells(grid, CGXRange(3, 2, 4, 2));
+    EXPECT_TRUE(run(ID_EDIT_PASTE));
+
+    EXPECT_EQ(grid.text(3, 2), "2");
+    EXPECT_EQ(grid.text(4, 2), "1");
+}
+
+TEST_F(Clipboard, GivesASingleValueBackAsItWas) {
+    for (const char* const value : {"\"A\"", "5\" pipe", "A\tB", ""}) {
+        grid.write(1, 5, value);
+        grid.goTo(1, 5);
+        ASSERT_TRUE(run(ID_EDIT_COPY));
+        grid.goTo(2, 5);
+        EXPECT_TRUE(run(ID_EDIT_PASTE)) << value;
+        EXPECT_EQ(grid.text(2, 5), value);
+    }
+}
+
 TEST_F(Clipboard, UnderstandsADecimalCommaWhereTheUserWritesOne) {
     paste("1,5");
     EXPECT_EQ(grid.text(1, 1), "1");
@@ -239,6 +279,30 @@ TEST_F(Clipboard, TakesCutLinesAway) {
     EXPECT_TRUE(run(ID_EDIT_CUT));
     EXPECT_EQ(grid.GetRowCount(), 2U);
     EXPECT_EQ(grid.text(2, 1), "4");
+}
+
+TEST_F(Clipboard, BlanksAllRangesThatAreCut) {
+    user::selectCells(grid, CGXRange(1, 1, 1, 1));
+    user::clickLineHeader(grid, 3, user::Selecting::Add);
+
+    EXPECT_TRUE(run(ID_EDIT_CUT));
+
+    EXPECT_EQ(grid.text(1, 1), "");
+    EXPECT_EQ(grid.text(2, 1), "2");
+    EXPECT_EQ(grid.text(3, 1), "");
+    EXPECT_EQ(grid.GetRowCount(), 4U);
+}
+
+TEST_F(Clipboard, CutsNoLinesInSeveralPieces) {
+    screen.setClipboardText("before");
+    user::clickLineHeader(grid, 3);
+    user::clickLineHeader(grid, 1, user::Selecting::Add);
+
+    run(ID_EDIT_CUT);
+
+    EXPECT_EQ(clipboard(), "before");
+    EXPECT_EQ(grid.GetRowCount(), 4U);
+    EXPECT_EQ(grid.text(1, 1), "1");
 }
 
 TEST_F(Clipboard, TakesATextThatIsBeingTypedIntoTheCellFirst) {

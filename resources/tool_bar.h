@@ -4,7 +4,6 @@
 
 #include <span>
 
-// The document's menu, by language, and its tool bar and keys.
-std::span<const kota::MenuTemplate> englishMenus();
+// The document's tool bar and keys, the same in every language.
 std::span<const kota::ToolBarTemplate> toolBars();
 std::span<const kota::AcceleratorTable> acceleratorTables();

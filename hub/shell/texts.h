@@ -1,0 +1,23 @@
+#pragma once
+
+#include "platform/framework/module.h"
+
+namespace kota::hub {
+
+// What the shell itself says. Behind a name stands what the text is filled in with, as %1 and %2.
+enum class HubText : UINT {
+    NoEditorFor = 1, // path
+    New,
+    WhatKind,
+    About,
+    VersionAndEditors, // version, names
+    NoEditors,
+    NotLoaded,  // file, reason
+    NoEditorIn, // folder
+};
+
+// Strings, prompts and menu, by language.
+const Resources& englishTexts();
+const Resources& japaneseTexts();
+
+} // namespace kota::hub

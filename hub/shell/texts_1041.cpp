@@ -1,0 +1,80 @@
+#include "hub/shell/menu_tree.h"
+#include "hub/shell/texts.h"
+
+namespace kota::hub {
+
+namespace {
+
+constexpr MenuTexts menu{
+    .file = "ファイル(&F)",
+    .fileNew = "新規作成(&N)\tCtrl+N",
+    .fileOpen = "開く(&O)...\tCtrl+O",
+    .fileClose = "閉じる(&C)",
+    .fileSave = "上書き保存(&S)\tCtrl+S",
+    .fileSaveAs = "名前を付けて保存(&A)...",
+    .recentFile = "最近使ったファイル",
+    .dataUtility = "データ ユーティリティ...",
+    .exit = "終了(&X)\tCtrl+Q",
+    .edit = "編集(&E)",
+    .undo = "元に戻す(&U)\tCtrl+Z",
+    .cut = "切り取り(&T)\tCtrl+X",
+    .copy = "コピー(&C)\tCtrl+C",
+    .paste = "貼り付け(&P)\tCtrl+V",
+    .view = "表示(&V)",
+    .toolbar = "ツール バー(&T)",
+    .statusBar = "ステータス バー(&S)",
+    .window = "ウィンドウ(&W)",
+    .newWindow = "新しいウィンドウ(&N)",
+    .cascade = "重ねて表示(&C)",
+    .tile = "並べて表示(&T)",
+    .arrangeIcons = "アイコンの整列(&A)",
+    .help = "ヘルプ(&H)",
+    .about = "KOTAHub について(&A)...",
+};
+
+constexpr UINT id(HubText text) {
+    return static_cast<UINT>(text);
+}
+
+constexpr StringResource strings[] = {
+    {id(HubText::NoEditorFor), "%1 を開けません。この種類のファイルに対応するエディターがありません。"},
+    {id(HubText::New), "新規作成"},
+    {id(HubText::WhatKind), "文書の種類を選んでください。"},
+    {id(HubText::About), "KOTAHub について"},
+    {id(HubText::VersionAndEditors), "KOTAHub %1\n\nエディター: %2"},
+    {id(HubText::NoEditors), "なし"},
+    {id(HubText::NotLoaded), "%1 を読み込めませんでした: %2"},
+    {id(HubText::NoEditorIn), "%1 にエディターがありません。"},
+    {ID_FILE_NEW, "新しい文書を作成します。"},
+    {ID_FILE_OPEN, "既存の文書を開きます。"},
+    {ID_FILE_CLOSE, "文書とそのすべてのウィンドウを閉じます。"},
+    {ID_FILE_SAVE, "文書を保存します。"},
+    {ID_FILE_SAVE_AS, "文書を別の名前で保存します。"},
+    {ID_FILE_MRU_FILE1, "この文書を開きます。"},
+    {ID_APP_EXIT, "すべての文書を閉じてプログラムを終了します。"},
+    {ID_EDIT_UNDO, "直前の操作を元に戻します。"},
+    {ID_EDIT_CUT, "選択範囲を切り取ってクリップボードに移します。"},
+    {ID_EDIT_COPY, "選択範囲をクリップボードにコピーします。"},
+    {ID_EDIT_PASTE, "クリップボードの内容を貼り付けます。"},
+    {ID_VIEW_TOOLBAR, "ツール バーの表示と非表示を切り替えます。"},
+    {ID_VIEW_STATUS_BAR, "ステータス バーの表示と非表示を切り替えます。"},
+    {ID_WINDOW_NEW, "文書の別のウィンドウを開きます。"},
+    {ID_WINDOW_CASCADE, "ウィンドウを重ねて並べます。"},
+    {ID_WINDOW_TILE_HORZ, "ウィンドウを並べて表示します。"},
+    {ID_WINDOW_ARRANGE, "アイコン化されたウィンドウを整列して表示します。"},
+    {ID_APP_ABOUT, "プログラムの版とエディターを表示します。"},
+};
+
+} // namespace
+
+const Resources& japaneseTexts() {
+    static const Resources texts{.strings = strings, .menus = MenuTree<menu>::all};
+    return texts;
+}
+
+} // namespace kota::hub
+
+// What the language library shows of itself; see kota::resourcesOf.
+extern "C" KOTA_EXPORT const kota::Resources* KotaResources() {
+    return &kota::hub::japaneseTexts();
+}
