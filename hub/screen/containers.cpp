@@ -2,10 +2,11 @@
 
 #include "hub/screen/text.h"
 
+#include <QApplication>
 #include <QBoxLayout>
 #include <QFormLayout>
-#include <QFrame>
 #include <QGroupBox>
+#include <QScrollArea>
 
 namespace kota::hub {
 
@@ -72,11 +73,19 @@ SheetPart::SheetPart(Parts& parts, HWND window)
     : ContainerPart(parts, window, new QWidget, new QVBoxLayout), pages_(new QVBoxLayout) {
     layout().setContentsMargins(0, 0, 0, 0);
     layout().setSpacing(0);
-    auto* const pane = new QFrame;
-    pane->setFrameShape(QFrame::StyledPanel);
+    auto* const pane = new QWidget;
     pane->setLayout(pages_);
     pages_->setContentsMargins(0, 0, 0, 0);
-    layout().addWidget(pane, 1);
+    auto* const room = new QScrollArea;
+    room->setFrameShape(QFrame::StyledPanel);
+    room->setFocusPolicy(Qt::NoFocus);
+    room->setWidgetResizable(true);
+    room->setWidget(pane);
+    layout().addWidget(room, 1);
+    QObject::connect(qApp, &QApplication::focusChanged, room, [room](const QWidget*, QWidget* focus) {
+        if (focus && room->widget()->isAncestorOf(focus))
+            room->ensureWidgetVisible(focus);
+    });
 }
 
 void SheetPart::add(Part& child) {

@@ -50,7 +50,8 @@ public:
     void add(Part& child) override;
 };
 
-// The tabs, and behind them the pages, of which the platform shows one.
+// The tabs, and below them the pages, of which the platform shows one. A page that has too little room is
+// scrolled.
 class SheetPart : public ContainerPart {
 public:
     SheetPart(Parts& parts, HWND window);

@@ -138,6 +138,12 @@ QColor GridView::lineColour() const {
         static_cast<QRgb>(style()->styleHint(QStyle::SH_Table_GridLineColor, &option, this)));
 }
 
+QSize GridView::minimumSizeHint() const {
+    constexpr int fewLines = 5;
+    const int height = horizontalHeader()->height() + fewLines * verticalHeader()->defaultSectionSize();
+    return {QTableView::minimumSizeHint().width(), height};
+}
+
 QRect GridView::visualRect(const QModelIndex& index) const {
     if (!index.isValid())
         return {};

@@ -49,6 +49,8 @@ public:
     QStyleOptionViewItem cellOption() const;
     QColor lineColour() const;
 
+    // Room for the headings and a few lines.
+    QSize minimumSizeHint() const override;
     QRect visualRect(const QModelIndex& index) const override;
     QModelIndex indexAt(const QPoint& point) const override;
     void scrollTo(const QModelIndex& index, ScrollHint hint = EnsureVisible) override;
