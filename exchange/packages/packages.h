@@ -10,7 +10,8 @@
 class CView;
 
 // What travels between the editors and the shell: objects in one address space, so sender and receiver are
-// built on this header. A package lives on its sender's stack for one SendMessage.
+// built on this header. A package lives on its sender's stack for one SendMessage: a receiver keeps neither
+// the package nor what it points to.
 
 // The base of everything that travels.
 class KOTA_PACKAGES_API CKhCBEItem : public CObject {
@@ -38,12 +39,12 @@ public:
     CK31_CBE_ModelDataItem();
     ~CK31_CBE_ModelDataItem() override;
 
-    CString riverName;
+    CString riverName;         // UTF-8
     double chainage = 0.0;     // m
     double chainage2 = 0.0;    // m
     std::int32_t dataType = 0; // a DataType
-    CString secondText;
-    std::int32_t flag = 0;
+    CString secondText;        // empty in what this editor sends
+    std::int32_t flag = 0;     // 0 in what this editor sends
 };
 
 // The kind of every package that this editor sends.
@@ -64,12 +65,21 @@ public:
 
 // wParam of "KOTAHubCommunicationBetweenEditors". lParam is a package, which must not be kept.
 namespace CommunicationCode {
-inline constexpr WPARAM GetData = 42;          // to a view: a sibling asks for the data list
-inline constexpr WPARAM InsertData = 62;       // to a view: a sibling inserts items[0]
-inline constexpr WPARAM DeleteData = 82;       // to a view: a sibling deletes items[0]
-inline constexpr WPARAM LocationChanged = 503; // to the main window: items is the current location; no
-                                               // package when the view goes away
-inline constexpr WPARAM DataChanged = 523;     // to the main window: the document's data changed
+inline constexpr WPARAM GetData = 42;    // to a view: a sibling asks for the data list
+inline constexpr WPARAM InsertData = 62; // to a view: a sibling inserts items[0]
+inline constexpr WPARAM DeleteData = 82; // to a view: a sibling deletes items[0]
+// To the main window: `items` is the place of the current line, a single item of the sender's; no package
+// (lParam 0) when the view goes away.
+inline constexpr WPARAM LocationChanged = 503;
+// To the main window: the data of the document `documentName` changed. The package has neither sender nor
+// items.
+inline constexpr WPARAM DataChanged = 523;
+
+// Whether a shell that gets the code hands it on to the views of all editors, by the same message. Of a
+// document outside a project, neither is sent but for LocationChanged without a package.
+constexpr bool isToldToAll(WPARAM code) {
+    return code == LocationChanged || code == DataChanged;
+}
 } // namespace CommunicationCode
 
 // wParam of "KOTAHubSwitchBoardSevice", to the main window. The answer is the result of SendMessage.

@@ -213,6 +213,8 @@ LRESULT HubFrame::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
         ShowToolBar(static_cast<UINT>(wParam), message == showToolbarMessage());
         return 0;
     }
+    if (message == communicationMessage() && CommunicationCode::isToldToAll(wParam))
+        PassOn(message, wParam, lParam);
     if (message == switchBoardMessage() || message == communicationMessage())
         return 0;
     return CKhMDIFrameWnd::WindowProc(message, wParam, lParam);

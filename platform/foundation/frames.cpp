@@ -108,3 +108,12 @@ void CKhMDIFrameWnd::ShowToolBar(UINT command, bool show) {
             bar->ShowWindow(show);
     }
 }
+
+void CKhMDIFrameWnd::PassOn(UINT message, WPARAM wParam, LPARAM lParam) {
+    std::vector<HWND> views;
+    for (const CMDIChildWnd* child : Children())
+        if (const CView* const view = child->GetActiveView())
+            views.push_back(view->GetSafeHwnd());
+    for (const HWND view : views)
+        ::SendMessage(view, message, wParam, lParam);
+}

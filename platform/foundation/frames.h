@@ -46,6 +46,9 @@ public:
     // As an editor asks that knows a tool bar by a command: hides the docked bars with that command, or shows
     // the one among them that belongs to the document in front.
     void ShowToolBar(UINT command, bool show);
+    // Hands a message of an editor on to the active views of all documents' frames, the sender's among them.
+    // A view that is closed meanwhile is left out.
+    void PassOn(UINT message, WPARAM wParam, LPARAM lParam);
 
 protected:
     void OnUpdateFrameMenu(const CDocTemplate* front) override;

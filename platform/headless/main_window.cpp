@@ -101,7 +101,11 @@ LRESULT MainWindow::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
     if (!toSwitchBoard && message != communicationMessage())
         return CKhMDIFrameWnd::WindowProc(message, wParam, lParam);
     record(message, wParam, reinterpret_cast<const CKHComm_Package*>(lParam));
-    return toSwitchBoard ? answer(wParam) : 0;
+    if (toSwitchBoard)
+        return answer(wParam);
+    if (CommunicationCode::isToldToAll(wParam))
+        PassOn(message, wParam, lParam);
+    return 0;
 }
 
 } // namespace kota::headless

@@ -23,8 +23,8 @@ struct Received {
     std::optional<Location> location; // of LocationChanged: what the item held
 };
 
-// The main window of a shell: answers the editors' requests from a project given to it, and records what
-// they send.
+// The main window of a shell: answers the editors' requests from a project given to it, records what they
+// send, and hands on to all of them what one tells (CommunicationCode::isToldToAll).
 class MainWindow : public CKhMDIFrameWnd {
 public:
     MainWindow();
@@ -40,7 +40,8 @@ public:
     std::vector<Received> received(WPARAM code) const;
     void forgetReceived() { received_.clear(); }
 
-    // Called with each message before it is answered, so that a test can call back into the editor from it.
+    // Called with each message before it is answered or handed on, so that a test can call back into the
+    // editor from it.
     std::function<void(const Received&)> onMessage;
 
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;

@@ -1,4 +1,5 @@
 #include "tests/hub/shown_shell.h"
+#include "tests/support/hearing_view.h"
 
 #include <QMdiArea>
 
@@ -34,6 +35,16 @@ protected:
     }
     bool areAllVisible() const { return windowOf(first())->isVisible() && windowOf(second())->isVisible(); }
 };
+
+TEST_F(TwoDocuments, HearWhatAnEditorTellsTheShellAndNothingElse) {
+    kota::test::HearingView hearing(*first());
+
+    for (const WPARAM code : {503U, 42U, 62U, 82U, 523U})
+        shell.frame.SendMessage(communicationMessage(), code);
+    shell.frame.SendMessage(switchBoardMessage(), 523U);
+
+    EXPECT_EQ(hearing.codes, (std::vector<WPARAM>{503, 523}));
+}
 
 TEST_F(TwoDocuments, ComeToTheFrontByAClickOnTheirTitle) {
     expectInFront(second());
