@@ -10,8 +10,17 @@
 
 class CView;
 
-// The parameter document: all that an .ad31 file holds, in memory. Pages and the exchange read and write its
-// members directly. Whoever ends a document calls DeleteContents first, which deletes the records.
+// The parameter document: all that an .ad31 file holds, in memory. Pages, the exchange and siblings read and
+// write its members directly, in base units.
+//
+// Pages delete records and build them anew: a pointer to a record is good until something runs that a page
+// may store in, as UpdateAllViews, a save, an input of the user or a message to the shell. Who changes
+// records first has the pages take over what is being typed (TakePendingInput), and afterwards calls
+// UpdateAll(nullptr, UpdateHint::Fill, nullptr) and DataChange.
+//
+// A document that a template made belongs to its views, which the user or the shell may close in any message.
+// Whoever makes one without a template calls DeleteContents before it is deleted, which deletes the records.
+// Arguments that are a CString by value serve callers built on the same SDK (kota::abiVersion).
 class KOTA0_AD_API CKota0_adDoc : public CKhDoc {
     DECLARE_DYNCREATE(CKota0_adDoc)
 public:
@@ -39,16 +48,19 @@ public:
     // The name of the component of that number, empty when there is none. The reference is good until the
     // components change.
     CString& GetCompName(int number);
-    // The number of the component of exactly that name, 0 when there is none.
+    // The number (AD_Component::number) of the component of exactly that name, 0 when there is none.
     int GetCompNum(CString name);
 
-    // Asks the shell for the project that the view's document belongs to. 1 in a project, 0 not.
+    // Asks the shell for the project that the view's document belongs to, and keeps its handle. 1 in a
+    // project, 0 not.
     int GetProjectInfo(CView* view, CString documentName);
     // Tells the shell that the view leaves the project. Outside a project nothing is sent.
     void LeaveProject(CView* view, CString documentName);
-    // Tells the shell that the document's data changed. Outside a project nothing is sent.
+    // Tells the shell that the document's data changed (CommunicationCode::DataChanged); the name is the
+    // document's title. Outside a project nothing is sent.
     void DataChange(CString documentName);
-    // Marks the document as modified, updates all views but the sender, and gives the sender the focus.
+    // Marks the document as modified, updates all views but the sender by an UpdateHint, and gives the sender
+    // the focus. Who has no view of the document sends null; the object may be null.
     void UpdateAll(CView* sender, int hint, CObject* hintObject);
 
     CString filePath; // as last opened

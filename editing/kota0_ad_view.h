@@ -26,7 +26,8 @@ class CNonCohesPage;
 
 // The one window of a document: the sheet of tabs with all pages, the commands of the Grid menu, and the
 // window through which the shell and sibling editors reach the document. It has no pages before
-// OnInitialUpdate.
+// OnInitialUpdate. Its frame deletes it: it is reached through its window's handle wherever a message may
+// have closed it.
 class KOTA0_AD_API CKota0_adView : public CFormView, public GridOwner {
     DECLARE_DYNCREATE(CKota0_adView)
 public:
@@ -34,7 +35,9 @@ public:
     // Leaves the project, and tells the shell that no location is current any more.
     ~CKota0_adView() override;
 
+    // Null when it is gone.
     CKota0_adDoc* GetDocument() const;
+    // The tabs; null before OnInitialUpdate.
     CDlgPropertySheet* Sheet() const { return sheet.get(); }
     // The page in front; null before OnInitialUpdate.
     CGenPropertyPage* ActivePage() const;
@@ -56,6 +59,7 @@ public:
     void OnGridDeleteLine() override;
     void OnGridSearch() override;
     void OnGridFindNext() override;
+    // Asks for the number of a line and goes there.
     void OnGridGotoLine();
     // Tells the grids which column takes river names. A grid takes it up when its tab is first shown.
     void SetRiverColumns();

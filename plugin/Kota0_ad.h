@@ -8,9 +8,11 @@
 
 class CKota0_adView;
 
+// The plug-in's exports. All are called on the thread of the user interface. None throws: null or 0 is the
+// result when an allocation failed. Arguments that are a CString by value serve callers built on the same SDK
+// (kota::abiVersion).
+
 // What the plug-in does for sibling editors, as static operations; no instance of the class does any work.
-// Without a view, `path` is opened. Of a list of items the first one counts, and the list stays the caller's.
-// Null or 0 is the result when an allocation failed, here and of the functions below.
 class KOTA0_AD_API CKota0_ad : public CWnd {
     DECLARE_DYNAMIC(CKota0_ad)
 public:
@@ -24,7 +26,11 @@ public:
     // when the window cannot be made, or a pointer is null: the tool bar stays the caller's as it is.
     static int InitToolBar(CKhToolBarEx* toolBar, CKhMDIFrameWnd* frame, unsigned long style, unsigned id);
 
-    // The four data operations; see exchange/operations.h.
+    // The four data operations, on the document of `view`, or of the file at `path` where that is null. Of a
+    // list of items the first one counts, and list and items stay the caller's. None of the four is available
+    // yet: they do nothing, and GetData gives null.
+    //
+    // A new list of new items, one for each record with a place, which the caller owns; or null.
     static CObList* GetData(CString path, CKota0_adView* view);
     static void InsertData(CString path, CKota0_adView* view, CObList* items);
     static void DeleteData(CString path, CKota0_adView* view, CObList* items);
@@ -35,7 +41,7 @@ public:
 
 extern "C" {
 
-// What the shell asks for, in this order. A shell finds these by their names.
+// What the shell asks for, in this order. A shell finds these by their names; kota::PlugIn does.
 
 // Always 1.
 KOTA0_AD_API int KhGetNumDocTemplates();
@@ -56,7 +62,7 @@ KOTA0_AD_API int KhGetEditorString(CString* out);
 // Gives the tool bar's name. 0, and `out` stays as it was, for any other index than 0.
 KOTA0_AD_API int KhGetToolbarString(CString* out, int index);
 
-// The data operations for a module that has only a path; see exchange/operations.h.
+// The data operations for a module that has only a path. Not available yet, as those of CKota0_ad.
 KOTA0_AD_API CObList* K31MSGGetData(CString path, CKota0_adView* view);
 KOTA0_AD_API void K31MSGInsertData(CString path, CKota0_adView* view, CObList* items);
 KOTA0_AD_API void K31MSGDeleteData(CString path, CKota0_adView* view, CObList* items);

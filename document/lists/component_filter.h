@@ -5,7 +5,8 @@
 
 class CCompList;
 
-// Which components a page offers, by their kind.
+// Which components a page offers, by their kind (AD_Component::kind); each record's class says which one its
+// componentNum goes by.
 enum KindFilter : int {
     AllKinds = 0,
     CohesiveKinds = 1,    // kinds 1 and 2
@@ -14,8 +15,8 @@ enum KindFilter : int {
 };
 
 // Whether a component of that kind passes a KindFilter; another value of the filter passes none.
-bool passesKindFilter(int kind, int kindFilter);
+KOTA0_AD_API bool passesKindFilter(int kind, int kindFilter);
 
 // The name of the n-th component, from 1, that passes the filter; of the list's last component when the list
 // ends before that. Empty for n below 1 and for an empty list.
-CString GetFilteredCompName(const CCompList& components, int n, int kindFilter);
+KOTA0_AD_API CString GetFilteredCompName(const CCompList& components, int n, int kindFilter);

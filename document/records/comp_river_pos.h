@@ -25,14 +25,15 @@ public:
     // name and chainage as "" and 0.0.
     virtual void SaveLocation(void* file);
 
+    // The members below, by the names of the contract.
     int GetComponentNum() const;
     CString GetRiverName() const;
     void SetRiverName(CString name);
     double GetChainage() const;
     void SetChainage(double value);
 
-    // 0: no component chosen; n: the n-th component that the record's page offers; -1 marks a cohesive or a
-    // layer record that is not to be written.
+    // 0: no component chosen; n: the n-th component that the record's page offers, by the class's KindFilter
+    // (GetFilteredCompName gives its name); -1 marks a cohesive or a layer record that is not to be written.
     int componentNum = 0;
     // Not 0: the record holds everywhere, and riverName and chainage do not count.
     int isGlobal = 0;

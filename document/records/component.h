@@ -10,11 +10,14 @@ public:
     AD_Component();
     ~AD_Component() override;
 
+    // As those of AD_Comp_RiverPos.
     virtual void Save(void* file);
     virtual void Load(void* keyword);
 
     CString name;
     int number = 0; // its line on the components page, from 1
     int units = 0;  // its place in the page's list of units, from 1
-    int kind = 0;   // what the pages' component filters go by
+    // 0 normal, 1 single layer cohesive, 2 multi layer cohesive, 3 non-cohesive (from a file alone). What a
+    // KindFilter goes by.
+    int kind = 0;
 };

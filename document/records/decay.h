@@ -2,7 +2,7 @@
 
 #include "document/records/comp_river_pos.h"
 
-// The first-order decay of a component.
+// The first-order decay of a component (KindFilter AllKinds).
 class KOTA0_AD_API AD_Decay : public AD_Comp_RiverPos {
 public:
     AD_Decay(); // global

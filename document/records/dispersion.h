@@ -2,8 +2,9 @@
 
 #include "document/records/comp_river_pos.h"
 
-// The dispersion at a place of a river, for all components: dispersion coefficient = factor * velocity to the
-// power of the exponent, within the two bounds. Always local: on file it has no component and no triple.
+// The dispersion at a place of a river, for all components: dispersion coefficient (m^2/s) = factor *
+// velocity (m/s) to the power of the exponent, within the two bounds. Always local: on file it has no
+// component and no triple.
 class KOTA0_AD_API AD_Dispersion : public AD_Comp_RiverPos {
 public:
     AD_Dispersion(); // local

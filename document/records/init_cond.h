@@ -2,7 +2,7 @@
 
 #include "document/records/comp_river_pos.h"
 
-// The initial concentration of a component.
+// The initial concentration of a component (KindFilter AllKinds).
 class KOTA0_AD_API AD_Init_cond : public AD_Comp_RiverPos {
 public:
     AD_Init_cond(); // global
@@ -14,8 +14,9 @@ public:
     double concentration = 0.0; // in the component's unit
 };
 
-// The initial condition of a component in stratified water: concentrations from the surface to the bottom,
-// and two coefficients of the exchange between them, which the editor hands on as they are.
+// The initial condition of a component (KindFilter AllKinds) in stratified water: concentrations from the
+// surface to the bottom, and two coefficients of the exchange between them, which the editor hands on as they
+// are.
 class KOTA0_AD_API AD_Init_cond_stra : public AD_Comp_RiverPos {
 public:
     AD_Init_cond_stra(); // global

@@ -4,6 +4,7 @@
 #include "document/records/comp_river_pos.h"
 
 // The initial condition of a cohesive sediment layer, with a table of its own of widths and layer heights.
+// Its component goes by KindFilter SedimentKinds.
 class KOTA0_AD_API AD_Cohesiv_ST_Init_Cond : public AD_Comp_RiverPos {
 public:
     AD_Cohesiv_ST_Init_Cond(); // global

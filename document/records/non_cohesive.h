@@ -2,7 +2,7 @@
 
 #include "document/records/comp_river_pos.h"
 
-// A non-cohesive sediment fraction.
+// A non-cohesive sediment fraction. Its component goes by KindFilter NonCohesiveKinds.
 class KOTA0_AD_API AD_NonCohesiv_ST_Data : public AD_Comp_RiverPos {
 public:
     AD_NonCohesiv_ST_Data(); // global

@@ -8,6 +8,7 @@ public:
     AD_ST_Init_Cond_data();
     ~AD_ST_Init_Cond_data() override;
 
+    // As those of AD_Comp_RiverPos.
     virtual void Save(void* file);
     virtual void Load(void* keyword);
 

@@ -22,5 +22,6 @@ public:
     ~CComboBox() override;
     // From 0, -1 for none.
     int GetCurSel() { return static_cast<int>(SendMessage(CB_GETCURSEL)); }
+    // Chooses an entry and gives it; -1, and none is chosen, when there is no such entry.
     int SetCurSel(int entry);
 };

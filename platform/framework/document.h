@@ -19,13 +19,13 @@ public:
     ~CDocument() override;
 
     const CString& GetTitle() const { return title_; }
-    virtual void SetTitle(const char* title);
+    virtual void SetTitle(const char* title); // and that of its frames
     // The file's path as last opened or saved; empty for a document that was never saved.
     const CString& GetPathName() const { return pathName_; }
     // Sets the path, and the file's name as the title.
     virtual void SetPathName(const char* path);
 
-    virtual BOOL IsModified();
+    virtual BOOL IsModified(); // whether there are changes that are not saved
     virtual void SetModifiedFlag(BOOL modified = TRUE);
 
     // Views are not owned. A view that is constructed for a document adds itself by AddView.
@@ -37,7 +37,7 @@ public:
     // takes away is not called. The document itself must outlive the call.
     void UpdateAllViews(CView* sender, LPARAM hint = 0, CObject* hintObject = nullptr);
 
-    virtual void Serialize(CArchive& archive);
+    virtual void Serialize(CArchive& archive); // never called
     // Empties the document before it is used anew or destroyed.
     virtual void DeleteContents();
     // Makes the document a new one: empty, without a path, not modified. The title is the caller's to set.

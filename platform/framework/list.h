@@ -44,6 +44,7 @@ public:
     // The place of a zero-based index; null when the list is shorter.
     POSITION FindIndex(int index) const;
 
+    // Each gives the place of the new element.
     POSITION AddHead(Argument value);
     POSITION AddTail(Argument value);
     POSITION InsertBefore(POSITION position, Argument value);

@@ -36,7 +36,7 @@ public:
     explicit CPropertySheet(const CString& caption);
     ~CPropertySheet() override;
 
-    void AddPage(CPropertyPage* page);
+    void AddPage(CPropertyPage* page); // at the end; before Create
     // Makes the sheet's window inside `parent`, with its first page.
     BOOL Create(CWnd* parent, unsigned style, unsigned extendedStyle);
     // Called once the tab control is there, before the first page is made.

@@ -40,11 +40,14 @@ public:
     // Opens a file, or makes a new document with null, in a frame of its own. The document belongs to its
     // views and ends with the last one. Null, and nothing is left, when that failed.
     virtual CDocument* OpenDocumentFile(const char* path, BOOL makeVisible = TRUE) = 0;
+    // A new document without a frame, which ends by OnCloseDocument; null when its class cannot be made by
+    // name.
     CDocument* CreateNewDocument();
     // A further frame with a view of the document; null when that failed. `other` may be null.
     CFrameWnd* CreateNewFrame(CDocument* document, CFrameWnd* other);
+    // See CFrameWnd::InitialUpdateFrame.
     void InitialUpdateFrame(CFrameWnd* frame, CDocument* document, BOOL makeVisible);
-    // The open document of a path, or null.
+    // The open document of this template whose file is that of a path, or null.
     CDocument* FindOpen(const char* path) const;
     const std::vector<CDocument*>& Documents() const { return documents_; }
 

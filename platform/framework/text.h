@@ -9,7 +9,8 @@
 
 // A text of 8-bit characters, UTF-8 by convention and never checked: any bytes may stand in it, NUL
 // included. A value: copies share their bytes until one of them is changed. Nothing that allocates is inline,
-// so that a text made in one library may be changed and destroyed in another.
+// so that a text made in one library may be changed and destroyed in another. Where one is passed by value,
+// both sides must be built on the same SDK (kota::abiVersion).
 class KOTA_API CString {
 public:
     CString() noexcept {}

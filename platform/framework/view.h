@@ -36,6 +36,7 @@ public:
     // frame is left or entered, both views are this one.
     virtual void OnActivateView(BOOL activate, CView* activateView, CView* deactiveView);
 
+    // Before the document is printed; 0 does not print. The base gives 0.
     virtual BOOL OnPreparePrinting(CPrintInfo* info);
     // The print commands. Nothing prints here: the user is told so.
     void OnFilePrint();
@@ -47,6 +48,7 @@ public:
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
 protected:
+    // Tells the user that nothing prints here, and gives 0.
     BOOL DoPreparePrinting(CPrintInfo* info);
     void PostNcDestroy() override;
 

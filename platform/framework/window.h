@@ -77,7 +77,7 @@ public:
     // The same, and gives it the focus.
     BOOL SetForegroundWindow();
 
-    virtual CMenu* GetMenu();
+    virtual CMenu* GetMenu(); // owned by the window; null for none
     // The menu as it stands is to be shown.
     void DrawMenuBar();
 
@@ -119,7 +119,7 @@ private:
     HWND handle_ = nullptr;
 };
 
-KOTA_API bool IsWindow(HWND handle);
+KOTA_API bool IsWindow(HWND handle); // whether it is that of a living window
 
 // Runs the window's WindowProc and gives its result; 0 for a handle of no living window. An
 // invalid-argument failure inside ends the handler: the user is told in a box and the result is 0.

@@ -168,7 +168,7 @@ public:
     // The last refusal; its text is empty when the edit has gone on since.
     const kota::GridWarning& Warning() const;
 
-    void Redraw(UINT flags = 0, BOOL update = TRUE);
+    void Redraw(UINT flags = 0, BOOL update = TRUE); // all of it; neither argument counts
     // Draws the cells anew. The control of a cell that is being edited is loaded from the stored value.
     void RedrawRowCol(const CGXRange& range);
     BOOL EnableGridToolTips(BOOL enable = TRUE);

@@ -33,15 +33,17 @@ public:
     ScriptedScreen& screen() { return screen_; }
     Application& application() { return application_; }
 
-    // Makes the templates and the tool bars of a plug-in known; see PlugIn. Its language libraries stand in
-    // the folder `languages` beside it.
+    // Makes the templates and the tool bars of a plug-in known, as a shell does. Throws std::runtime_error,
+    // with the reason, for a library that is none, or was built for another version; see PlugIn. Its language
+    // libraries stand in the folder `languages` beside it.
     void load(const std::string& path);
     const std::vector<std::unique_ptr<CKhToolBarEx>>& toolBars() const { return toolBars_; }
-    // Null when that failed; the user was told why in a box, unless no editor is for such files.
+    // Opens a file in a window of its own, or brings it to the front. Null when no template is for files of
+    // its kind, and when that failed; then the user was told why in a box. The document belongs to its views.
     CDocument* open(const std::string& path);
-    // A new document of the first template.
+    // A new document of the first template; null when there is none.
     CDocument* create();
-    // Saves under the document's name, or under another one.
+    // Saves under the document's name, or under another one. False when it was not saved.
     bool save(CDocument& document);
     bool saveAs(CDocument& document, const std::string& path);
 

@@ -31,18 +31,24 @@ public:
     CGXGridCore& grid() const;
     CGXGridCore& grid(UINT id) const;
 
-    // By the caption of its tab.
+    // By the caption of its tab. Throws std::runtime_error when there is none of that caption.
     bool selectTab(const std::string& caption);
     std::string tab() const;
+    // A VK_ key or a capital letter.
     bool key(WPARAM key, input::Modifiers modifiers = {});
+    // An entry of the menu, by its command.
     bool command(UINT id);
 
+    // Clicks a cell of the grid; lines and columns count from 1.
     bool putCursor(ROWCOL row, ROWCOL col);
+    // Gives the current cell this text, and stays in it.
     bool type(const std::string& text);
     // Types into the current cell, and leaves it by Enter.
     bool enter(const std::string& text);
+    // An entry of the current cell's list.
     bool choose(const std::string& entry);
     bool clickBox(ROWCOL row, ROWCOL col);
+    // By the headers of the lines.
     bool selectLines(ROWCOL first, ROWCOL last);
     // What a cell shows, and what it holds.
     std::string shown(ROWCOL row, ROWCOL col) const;
@@ -50,6 +56,7 @@ public:
     bool isReadOnly(ROWCOL row, ROWCOL col) const;
     // Line and column of the current cell; zeros for none.
     std::pair<ROWCOL, ROWCOL> cursor() const;
+    // Why the last text was refused; empty when none was.
     std::string warning() const;
 
     // Types into an edit without leaving it, and the same with leaving it for the tabs.
@@ -59,6 +66,7 @@ public:
     // Goes to another control of the page.
     bool goTo(UINT id);
 
+    // A further window of the document; and its window's close button.
     bool newWindow();
     bool closeWindow();
 

@@ -25,6 +25,7 @@ KOTA_API BOOL SystemParametersInfo(UINT action, NONCLIENTMETRICS& metrics);
 // set another one before the libraries were loaded; languages that there are no texts for count as English.
 KOTA_API int KhLangGetLanguage();
 namespace kota {
+// Sets the language of the libraries that are loaded from now on; 0 for that of the environment.
 KOTA_API void setLanguage(int language);
 // A further folder where language libraries are looked for, behind that of the platform itself. Once is
 // enough.

@@ -41,6 +41,11 @@ TEST(ExportedClasses, AreAllRecords) {
     expectExported<AD_ST_Init_Cond_data>();
 }
 
+TEST(ExportedFunctions, AreThoseThatNameTheComponentOfARecord) {
+    EXPECT_NE(kota::symbolOf(plugIn(), "_Z16passesKindFilterii"), nullptr);
+    EXPECT_NE(kota::symbolOf(plugIn(), "_Z19GetFilteredCompNameRK9CCompListii"), nullptr);
+}
+
 TEST(ExportedClasses, LetASiblingWorkWithADocument) {
     OwnedDocument document;
     addComponent(document.compList, 7, "BOD", 1);
