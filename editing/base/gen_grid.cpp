@@ -57,6 +57,11 @@ void CGenGrid::DeleteSelectedLines() {
     CGXRange lines = selection.GetHead();
     lines.ExpandRange(1, 0, GetRowCount(), 0);
     RemoveRows(lines.top, lines.bottom);
+    // The current cell does not follow: where its line is gone, the last one is current.
+    ROWCOL row = 0;
+    ROWCOL col = 0;
+    if (GetCurrentCell(&row, &col) && row > GetRowCount() && GetRowCount() > GetHeaderRows())
+        SetCurrentCell(GetRowCount(), col, GX_SCROLLINVIEW | GX_KEEPFOCUS);
 }
 
 void CGenGrid::GotoGridLine(ROWCOL line) {

@@ -221,6 +221,19 @@ TEST_F(Deletion, OfAllLinesLeavesADefaultOneWhichIsStored) {
     EXPECT_THAT(told(), ElementsAre("523"));
 }
 
+TEST_F(Deletion, OfTheLineUnderTheCursorLeavesTheCursorInTheGrid) {
+    CKota0_adDoc& document = createDispersion();
+    User user(session);
+    user.putCursor(1, 3);
+    user.selectLines(2, 2);
+
+    user.command(CommandId::DeleteLine);
+
+    EXPECT_EQ(user.cursor(), std::make_pair(1U, 3U));
+    EXPECT_TRUE(user.enter("0.25")) << "the user goes on typing";
+    EXPECT_EQ(recordOf(document.dispersList).dispFactor, 0.25);
+}
+
 TEST_F(Deletion, WorksOnComponentsToo) {
     CKota0_adDoc& document = create();
     addComponent(document.compList, 1, "BOD", 0);
