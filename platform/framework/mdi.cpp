@@ -83,7 +83,8 @@ void CMDIFrameWnd::MDIActivate(CMDIChildWnd* child) {
     ShowMenuOf(child);
     child->BringWindowToTop();
     view->OnActivateView(TRUE, view, view);
-    view->SetFocus();
+    if (activeChild_ == entered && IsWindow(entered))
+        view->SetFocus();
 }
 
 void CMDIFrameWnd::ShowMenuOf(CMDIChildWnd* child) {

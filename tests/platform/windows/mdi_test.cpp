@@ -92,6 +92,38 @@ TEST_F(Activation, MayCloseADocumentWhileItIsOpened) {
     EXPECT_EQ(docTemplate.Documents().size(), 0U);
 }
 
+TEST_F(Activation, MayBringAThirdFrameToTheFront) {
+    openWith(docTemplate, "/rivers/c.tst");
+    TestView::onActivate = [&](const TestView& view, bool activate) {
+        if (&view == firstView && activate)
+            frameOf(second).ActivateFrame();
+    };
+    {
+        const Turn turn;
+        frameOf(first).ActivateFrame();
+    }
+    TestView::onActivate = nullptr;
+
+    EXPECT_EQ(front(), &frameOf(second));
+    EXPECT_EQ(CWnd::GetFocus(), secondView);
+}
+
+TEST_F(Activation, MayCloseTheFrameThatIsEntered) {
+    CFrameWnd& entered = frameOf(first);
+    TestView::onActivate = [&](const TestView& view, bool activate) {
+        if (&view == firstView && activate)
+            entered.DestroyWindow();
+    };
+    {
+        const Turn turn;
+        entered.ActivateFrame();
+    }
+    TestView::onActivate = nullptr;
+
+    EXPECT_EQ(front(), &frameOf(second));
+    EXPECT_EQ(CWnd::GetFocus(), secondView);
+}
+
 TEST_F(Activation, MayCloseTheMainWindow) {
     TestView::onActivate = [&](const TestView&, bool) {
         TestView::onActivate = nullptr;
