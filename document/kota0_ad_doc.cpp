@@ -175,6 +175,8 @@ void CKota0_adDoc::UpdateAll(CView* sender, int hint, CObject* hintObject) {
     const HWND senderWindow = sender ? sender->GetSafeHwnd() : nullptr;
     SetModifiedFlag(TRUE);
     UpdateAllViews(sender, hint, hintObject);
-    if (IsWindow(senderWindow))
+    // The shell may have brought another document to the front meanwhile: the keys are that one's.
+    const CWnd* const stillThere = CWnd::FromHandle(senderWindow);
+    if (stillThere && stillThere->MayTakeFocus())
         SetFocus(senderWindow);
 }

@@ -11,16 +11,24 @@ namespace {
 HWND theFocus = nullptr;
 HWND nextFocus = nullptr; // while the focus is on its way there
 
-bool canTakeFocus(HWND handle) {
-    const CWnd* const window = CWnd::FromHandle(handle);
-    return window && window->IsWindowEnabled();
-}
-
 // The document's frame in front of the others; null when there is none.
 CFrameWnd* frameInFront() {
     CWnd* const mainWindow = AfxGetMainWnd();
     const bool holdsFrames = mainWindow && mainWindow->IsKindOf(RUNTIME_CLASS(CMDIFrameWnd));
     return holdsFrames ? static_cast<CMDIFrameWnd*>(mainWindow)->MDIGetActive() : nullptr;
+}
+
+bool canTakeFocus(HWND handle) {
+    const CWnd* const window = CWnd::FromHandle(handle);
+    return window && window->IsWindowEnabled();
+}
+
+// Whether a window stands in a document's frame that is not in front.
+bool isBehind(HWND handle) {
+    const CWnd* const window = CWnd::FromHandle(handle);
+    const CFrameWnd* const frame = window ? window->GetParentFrame() : nullptr;
+    const CFrameWnd* const front = frameInFront();
+    return frame && front && frame != front && frame != AfxGetMainWnd();
 }
 
 // Whether the holder lets the focus go. It may close windows and move the focus on the way.
@@ -45,7 +53,11 @@ void forgetFocus(HWND handle) {
 
 HWND SetFocus(HWND handle) {
     const HWND previous = theFocus;
+    const bool wasBehind = isBehind(handle);
     if (handle == previous || (handle && !canTakeFocus(handle)) || !holderLetsGo())
+        return previous;
+    // Whoever heard of what the holder committed may have brought another document to the front.
+    if (!wasBehind && isBehind(handle))
         return previous;
     const HWND leaving = theFocus;
     if (handle == leaving || (handle && !canTakeFocus(handle)))

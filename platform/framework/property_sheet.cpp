@@ -137,6 +137,6 @@ void CPropertySheet::ShowPage(int index) {
     GetTabControl()->SendMessage(CB_SETCURSEL, static_cast<WPARAM>(index));
     kota::noteChange(GetSafeHwnd(), kota::Change::Contents);
     CWnd* const first = page->FirstFocusControl();
-    if (focusMoves && !page->IsChild(GetFocus()))
+    if (focusMoves && !page->IsChild(GetFocus()) && page->MayTakeFocus())
         (first ? first : GetTabControl())->SetFocus();
 }

@@ -174,4 +174,64 @@ TEST_F(AShellThatBringsAnotherTabToTheFront, WhenTheTabKeyAsksForALocationTakesT
     EXPECT_EQ(user.cursor(), std::make_pair(2U, 6U)) << "the grid behind has taken no step";
 }
 
+class AShellThatOpensAnotherDocument : public DocumentWindow {
+protected:
+    AShellThatOpensAnotherDocument() { openProject(); }
+
+    // Opens it when the code comes for the first time.
+    void openAt(WPARAM code) {
+        shell().onMessage = [this, code](const Received& received) {
+            if (received.code != code || opened)
+                return;
+            opened = true;
+            session.create();
+        };
+    }
+    // The keys go to the document in front.
+    void expectTheFocusInFront() {
+        ASSERT_TRUE(opened);
+        CWnd* const focus = CWnd::GetFocus();
+        ASSERT_NE(focus, nullptr);
+        EXPECT_EQ(focus->GetParentFrame(), shell().MDIGetActive());
+    }
+
+    bool opened = false;
+};
+
+TEST_F(AShellThatOpensAnotherDocument, WhenItIsAskedForALocationKeepsTheFocusThere) {
+    CKota0_adDoc& document = createDispersion();
+    User user(session);
+    shell().project().offers.push_back({"JAMES", 125.0, 0.0, 5});
+    openAt(200);
+
+    user.command(CommandId::InsertLine);
+
+    expectTheFocusInFront();
+    EXPECT_THAT(riversOf(document), ElementsAre("MISSOURI", "PLATTE", "JAMES"));
+}
+
+TEST_F(AShellThatOpensAnotherDocument, WhenAnEditIsLeftForTheTabsKeepsTheFocusThere) {
+    CKota0_adDoc& document = createDispersion();
+    User user(session);
+    user.putCursor(1, 1);
+    user.type("JAMES");
+    openAt(523);
+
+    EXPECT_FALSE(kota::input::focus(*user.sheet().GetTabControl()));
+
+    expectTheFocusInFront();
+    EXPECT_THAT(riversOf(document), ElementsAre("JAMES", "PLATTE"));
+}
+
+TEST_F(AShellThatOpensAnotherDocument, WhenATabIsShownKeepsTheFocusThere) {
+    addDispersion(create(), "MISSOURI", 1000.0);
+    User user(session);
+    openAt(503);
+
+    user.selectTab("Dispersion");
+
+    expectTheFocusInFront();
+    EXPECT_EQ(user.tab(), "Dispersion");
+}
+
 } // namespace
