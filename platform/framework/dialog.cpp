@@ -1,5 +1,6 @@
 #include "platform/framework/dialog.h"
 
+#include "platform/framework/frame.h"
 #include "platform/framework/input.h"
 #include "platform/framework/message_box.h"
 #include "platform/framework/screen.h"
@@ -70,6 +71,22 @@ BOOL CDialog::Create(UINT templateId, CWnd* parent) {
     return CreateOf(kota::WindowKind::Dialog, templateId, parent);
 }
 
+namespace {
+
+// The user goes on where they were; in the same window where that control is out of sight by now, and where
+// somebody else has put them meanwhile.
+void giveFocusBack(HWND before) {
+    if (::GetFocus())
+        return;
+    CWnd* const holder = CWnd::FromHandle(before);
+    const CFrameWnd* const frame = holder ? holder->GetParentFrame() : nullptr;
+    CWnd* const view = frame ? frame->GetActiveView() : nullptr;
+    CWnd* const next = holder && !holder->IsWindowVisible() && view ? view : holder;
+    ::SetFocus(next ? next->GetSafeHwnd() : nullptr);
+}
+
+} // namespace
+
 int CDialog::DoModal() {
     kota::Screen* const screen = kota::attachedScreen();
     if (!screen)
@@ -91,7 +108,7 @@ int CDialog::DoModal() {
     }
     ended_ = true;
     DestroyWindow();
-    ::SetFocus(IsWindow(focusBefore) ? focusBefore : nullptr);
+    giveFocusBack(focusBefore);
     return result_;
 }
 

@@ -69,6 +69,20 @@ TEST_F(GoingToALine, BelowOneIsRefusedAndTheDialogStays) {
     EXPECT_EQ(User(session).cursor().first, 2U);
 }
 
+TEST_F(GoingToALine, GivesTheFocusToTheTabThatTheShellShowsMeanwhile) {
+    createDispersion();
+    User user(session);
+    user.putCursor(1, 3);
+    session.screen().answerDialog([&](CDialog& dialog) {
+        user.sheet().SetActivePage(4);
+        dialog.EndDialog(IDCANCEL);
+    });
+
+    user.command(CommandId::GotoLine);
+
+    EXPECT_EQ(CWnd::GetFocus(), &user.grid(ControlId::DecayGrid));
+}
+
 TEST_F(GoingToALine, NeedsANumber) {
     createDispersion();
     session.screen().answerBox(IDOK);
