@@ -93,9 +93,11 @@ BOOL CGenGrid::SetCurrentCell(ROWCOL row, ROWCOL col, UINT flags) {
         ownerPage->SetActiveGrid(this);
     BOOL moved = CGXGridWnd::SetCurrentCell(row, col, flags);
     if (std::exchange(cellEdited, false)) {
+        const bool existed = row <= GetRowCount();
         if (GridOwner* const owner = Owner())
             owner->OnGridCellEdited(col);
-        moved = CGXGridWnd::SetCurrentCell(row, col, flags);
+        if (!existed || row <= GetRowCount()) // the shell may have taken the line away meanwhile
+            moved = CGXGridWnd::SetCurrentCell(row, col, flags);
     }
     if (row != currentRow) {
         currentRow = row;

@@ -4,6 +4,8 @@
 
 #include <gmock/gmock.h>
 
+#include <utility>
+
 using namespace kota::test;
 
 namespace {
@@ -168,6 +170,24 @@ TEST_F(Insertion, CommitsTheEditThatIsUnderWay) {
     EXPECT_EQ(user.grid().GetRowCount(), 3U);
     EXPECT_EQ(recordOf(document.dispersList).dispFactor, 7.0);
     EXPECT_TRUE(document.IsModified());
+}
+
+TEST_F(Insertion, ThatTheShellUndoesMeanwhileLeavesTheCursorInTheGrid) {
+    createDispersion();
+    User user(session);
+    user.putCursor(2, 3);
+    user.type("7");
+    bool undone = false;
+    shell().onMessage = [&](const kota::headless::Received& received) {
+        if (received.code == 523 && !std::exchange(undone, true))
+            user.command(ID_EDIT_UNDO);
+    };
+
+    user.command(CommandId::InsertLine);
+
+    ASSERT_TRUE(undone);
+    EXPECT_EQ(user.grid().GetRowCount(), 2U);
+    EXPECT_EQ(user.cursor().first, 2U);
 }
 
 TEST_F(Insertion, OfTheProbeDoesNoHarm) {
