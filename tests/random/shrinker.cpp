@@ -48,7 +48,9 @@ public:
         : script_(std::move(script)), fails_(fails), triesLeft_(mostTries) {}
 
     Script run() {
-        while (dropChunks() | simplifyActions()) { // both, each time
+        for (bool isShorter = true; isShorter;) {
+            const bool dropped = dropChunks();
+            isShorter = simplifyActions() || dropped;
         }
         return std::move(script_);
     }
