@@ -1,5 +1,6 @@
 #include "hub/screen/main_part.h"
 
+#include "hub/screen/dock.h"
 #include "hub/screen/parts.h"
 #include "hub/screen/pictures.h"
 #include "hub/screen/text.h"
@@ -134,7 +135,6 @@ void MainPart::fill(QMenu& menu, const CMenu& entries) {
         QAction* const action = menu.addAction(toQt(entry.text));
         action->setData(entry.id);
         action->setStatusTip(toQt(frame()->GetMessageString(entry.id)).section('\n', 0, 0));
-        action->setCheckable(isToggle(entry.id));
         QObject::connect(action, &QAction::triggered, this, [this, id = entry.id] { run(id); });
     }
     enableEntries(menu);
@@ -146,22 +146,33 @@ void MainPart::enableEntries(const QMenu& menu) const {
         if (id == 0)
             continue;
         action->setEnabled(isOwnCommand(id) ? canRunOwn(id) : input::canCommand(id));
-        if (id == ID_VIEW_TOOLBAR)
+        const QDockWidget* const panel = panelOf(id);
+        action->setCheckable(panel || isToggle(id));
+        if (panel)
+            action->setChecked(!panel->isHidden());
+        else if (id == ID_VIEW_TOOLBAR)
             action->setChecked(toolBarsWanted_);
         else if (id == ID_VIEW_STATUS_BAR)
             action->setChecked(!mainWindow().statusBar()->isHidden());
     }
 }
 
-bool MainPart::isOwnCommand(UINT id) {
-    return std::ranges::find(screenCommands, id) != screenCommands.end();
+bool MainPart::isOwnCommand(UINT id) const {
+    return panelOf(id) || std::ranges::find(screenCommands, id) != screenCommands.end();
+}
+
+QDockWidget* MainPart::panelOf(UINT id) const {
+    for (QDockWidget* const panel : mainWindow().findChildren<QDockWidget*>())
+        if (Dock::commandOf(*panel) == id)
+            return panel;
+    return nullptr;
 }
 
 bool MainPart::canRunOwn(UINT id) const {
     const QList<QMdiSubWindow*> frames = area_->subWindowList();
     if (id == ID_WINDOW_ARRANGE)
         return std::ranges::any_of(frames, &QMdiSubWindow::isMinimized);
-    return isToggle(id) || !frames.isEmpty();
+    return isToggle(id) || panelOf(id) || !frames.isEmpty();
 }
 
 void MainPart::run(UINT id) {
@@ -174,6 +185,13 @@ void MainPart::run(UINT id) {
 }
 
 void MainPart::runOwn(UINT id) {
+    if (QDockWidget* const panel = panelOf(id)) {
+        panel->setVisible(panel->isHidden());
+        panel->raise();
+        if (!panel->isHidden())
+            panel->setFocus(Qt::TabFocusReason);
+        return;
+    }
     switch (id) {
     case ID_VIEW_TOOLBAR:
         toolBarsWanted_ = !toolBarsWanted_;
@@ -266,6 +284,7 @@ void ToolBarPart::refresh(const WindowState& state) {
     const ToolBarTemplate* const buttons = source ? source->Buttons() : nullptr;
     if (!buttons || !bar().actions().isEmpty())
         return;
+    bar().setObjectName(QString("bar%1").arg(buttons->id)); // by which the toolkit keeps its place
     bar().setIconSize(QSize(buttons->buttonWidth, buttons->buttonHeight));
     const BitmapResource* const pictures = source->ResourceModule()->bitmap(buttons->id);
     int place = 0;

@@ -5,6 +5,7 @@
 #include "platform/foundation/frames.h"
 
 #include <QAction>
+#include <QDockWidget>
 #include <QMainWindow>
 #include <QMdiArea>
 #include <QMdiSubWindow>
@@ -36,8 +37,10 @@ private:
     void fill(QMenu& menu, const CMenu& entries);
     void enableEntries(const QMenu& menu) const;
     // The commands of the screen: whether it has this one, whether it can be carried out now.
-    static bool isOwnCommand(UINT id);
+    bool isOwnCommand(UINT id) const;
     bool canRunOwn(UINT id) const;
+    // The panel that a command shows and hides; null for other commands.
+    QDockWidget* panelOf(UINT id) const;
     void run(UINT id);
     void runOwn(UINT id);
     void activated(const QMdiSubWindow* frame) const;

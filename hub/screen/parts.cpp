@@ -6,7 +6,11 @@
 #include "hub/screen/grid_part.h"
 #include "hub/screen/main_part.h"
 
+#include <QApplication>
+#include <QDockWidget>
+
 #include <memory>
+#include <utility>
 #include <vector>
 
 namespace kota::hub {
@@ -52,6 +56,13 @@ std::unique_ptr<Part> makePart(Parts& parts, const CWnd& window) {
         return std::make_unique<ToolBarPart>(parts, handle);
     }
     return nullptr;
+}
+
+// Whether a widget is in a panel beside the documents, where the user may stay.
+bool isInPanel(const QWidget* widget) {
+    while (widget && !qobject_cast<const QDockWidget*>(widget))
+        widget = widget->parentWidget();
+    return widget != nullptr;
 }
 
 } // namespace
@@ -108,9 +119,10 @@ void Parts::settle() {
         shown->settle();
     const Part* const part = find(::GetFocus());
     QWidget* const target = part ? part->focusTarget() : nullptr;
+    const bool hasMoved = std::exchange(focusBefore_, ::GetFocus()) != ::GetFocus();
     // A field that is reached by a key has its text selected.
     const bool byKey = keyboard_.takeWasLast() && dynamic_cast<const EditPart*>(part);
-    if (target && !target->hasFocus())
+    if (target && !target->hasFocus() && (hasMoved || !isInPanel(QApplication::focusWidget())))
         target->setFocus(byKey ? Qt::TabFocusReason : Qt::OtherFocusReason);
 }
 

@@ -33,6 +33,7 @@ private:
     InputQueue& queue_;
     Keyboard keyboard_;
     std::map<HWND, Part*> parts_; // owned until they retire
+    HWND focusBefore_ = nullptr;  // the platform's, when it was settled last
 };
 
 } // namespace kota::hub

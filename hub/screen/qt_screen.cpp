@@ -138,6 +138,11 @@ std::optional<int> QtScreen::askChoice(const QString& title, const QString& ques
     return accepted ? std::optional(static_cast<int>(entries.indexOf(chosen))) : std::nullopt;
 }
 
+bool QtScreen::ask(QDialog& dialog) {
+    const Answering scope(queue_);
+    return dialog.exec() == QDialog::Accepted;
+}
+
 void QtScreen::showAbout(const QString& title, const QString& text, const QPixmap& picture) {
     const Answering scope(queue_);
     QMessageBox box(QMessageBox::NoIcon, title, text, QMessageBox::Ok, QApplication::activeWindow());

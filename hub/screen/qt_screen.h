@@ -4,6 +4,7 @@
 #include "platform/framework/frame.h"
 #include "platform/framework/screen.h"
 
+#include <QDialog>
 #include <QMainWindow>
 #include <QTimer>
 
@@ -33,6 +34,8 @@ public:
     QStringList askOpenNames(const QString& filters);
     // Asks for one of several things; its place among them, none when the user changed their mind.
     std::optional<int> askChoice(const QString& title, const QString& question, const QStringList& entries);
+    // Shows a dialog of the shell's own; whether the user accepted it.
+    bool ask(QDialog& dialog);
     // Tells the user about the program, with pictures beside the text.
     void showAbout(const QString& title, const QString& text, const QPixmap& picture);
     int showMessageBox(const MessageBoxRequest& request) override;

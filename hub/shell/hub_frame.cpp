@@ -1,9 +1,11 @@
 #include "hub/shell/hub_frame.h"
 
-#include "exchange/packages/packages.h"
+#include "hub/project/geojson.h"
 #include "hub/screen/pictures.h"
 #include "hub/screen/text.h"
+#include "hub/shell/commands.h"
 #include "hub/shell/menu.h"
+#include "hub/shell/settings_dialog.h"
 #include "platform/framework/document.h"
 #include "platform/framework/message_box.h"
 #include "platform/framework/messages.h"
@@ -61,6 +63,17 @@ QString shortened(const QString& path) {
     return path.size() <= most ? path : path.left(most / 3) + "..." + path.right(2 * most / 3);
 }
 
+bool isNetwork(const QString& path) {
+    const QString ending = QFileInfo(path).suffix();
+    return ending.compare("geojson", Qt::CaseInsensitive) == 0 ||
+           ending.compare("json", Qt::CaseInsensitive) == 0;
+}
+
+NetworkReading readBusily(const QString& path) {
+    const Busy busy;
+    return readNetwork(path);
+}
+
 void tell(const QString& text) {
     AfxMessageBox(toPlatform(text).constData());
 }
@@ -105,8 +118,59 @@ void HubFrame::load(PlugIns plugIns) {
 void HubFrame::openFiles(const QStringList& paths) {
     if (!TakePendingInput())
         return;
-    for (const QString& path : paths)
-        Open(path);
+    for (const QString& path : paths) {
+        if (isNetwork(path))
+            OpenProject(path);
+        else
+            Open(path);
+    }
+}
+
+QStringList HubFrame::documents() const {
+    QStringList paths;
+    for (const CMDIChildWnd* child : Children()) {
+        const CDocument* const document = child->GetActiveDocument();
+        const QString path = document ? QFile::decodeName(QByteArray(document->GetPathName())) : QString();
+        if (!path.isEmpty() && !paths.contains(path))
+            paths.append(path);
+    }
+    return paths;
+}
+
+void HubFrame::OpenProject(const QString& path) {
+    const QString file = QFileInfo(path).absoluteFilePath();
+    const NetworkReading reading = readBusily(file);
+    if (!reading.network) {
+        tell(reading.error);
+        return;
+    }
+    projects_.open(file, reading.network);
+    ProjectChanged();
+}
+
+void HubFrame::ProjectChanged() {
+    exchange_.offer({}); // it was picked in another project
+    const QString name = QFileInfo(projects_.path()).fileName();
+    SetWindowText(projects_.isOpen() ? toPlatform(QString("KOTAHub - %1").arg(name)).constData() : "KOTAHub");
+    if (onProject)
+        onProject();
+}
+
+void HubFrame::OnProjectOpen() {
+    const QString filter = hubText(HubText::RiverNetworks) + " (*.geojson *.json)";
+    for (const QString& path : screen_.askOpenNames(filter).mid(0, 1))
+        OpenProject(path);
+}
+
+void HubFrame::OnProjectClose() {
+    projects_.close();
+    ProjectChanged();
+}
+
+void HubFrame::OnSettings() {
+    SettingsDialog dialog(Settings::load(), QApplication::activeWindow());
+    if (screen_.ask(dialog))
+        dialog.chosen().save();
 }
 
 void HubFrame::Open(const QString& path) {
@@ -164,6 +228,12 @@ void HubFrame::OnExit() {
     OnClose();
 }
 
+void HubFrame::OnClose() {
+    if (onEnd)
+        onEnd();
+    CKhMDIFrameWnd::OnClose();
+}
+
 void HubFrame::OnAbout() {
     QStringList editors;
     for (const PlugIn& plugIn : plugIns_)
@@ -187,11 +257,16 @@ BOOL HubFrame::OnCmdMsg(UINT id, int notification) {
     static constexpr auto commands = kota::commandMap<HubFrame>({
         {ID_FILE_NEW, 0, &HubFrame::OnFileNew},
         {ID_FILE_OPEN, 0, &HubFrame::OnFileOpen},
+        {HubCommand::OpenProject, 0, &HubFrame::OnProjectOpen},
+        {HubCommand::CloseProject, 0, &HubFrame::OnProjectClose},
+        {HubCommand::Settings, 0, &HubFrame::OnSettings},
         {ID_APP_EXIT, 0, &HubFrame::OnExit},
         {ID_APP_ABOUT, 0, &HubFrame::OnAbout},
     });
     const bool needsEditor = id == ID_FILE_NEW || id == ID_FILE_OPEN;
     if (needsEditor && application_.Templates().empty())
+        return FALSE;
+    if (id == HubCommand::CloseProject && !projects_.isOpen())
         return FALSE;
     const BOOL done = runCommand(*this, commands, id, notification) || OpenRecent(id, notification) ||
                       CKhMDIFrameWnd::OnCmdMsg(id, notification);
@@ -209,15 +284,17 @@ void HubFrame::NoteSaved() {
 }
 
 LRESULT HubFrame::WindowProc(UINT message, WPARAM wParam, LPARAM lParam) {
-    if (message == showToolbarMessage() || message == hideToolbarMessage()) {
-        ShowToolBar(static_cast<UINT>(wParam), message == showToolbarMessage());
-        return 0;
+    if (!Exchange::isMessage(message))
+        return CKhMDIFrameWnd::WindowProc(message, wParam, lParam);
+    const bool shows = message == showToolbarMessage();
+    if (shows || message == hideToolbarMessage()) {
+        ShowToolBar(static_cast<UINT>(wParam), shows);
+        return exchange_.take(message, wParam, nullptr);
     }
+    const LRESULT answer = exchange_.take(message, wParam, reinterpret_cast<const CKHComm_Package*>(lParam));
     if (message == communicationMessage() && CommunicationCode::isToldToAll(wParam))
         PassOn(message, wParam, lParam);
-    if (message == switchBoardMessage() || message == communicationMessage())
-        return 0;
-    return CKhMDIFrameWnd::WindowProc(message, wParam, lParam);
+    return answer;
 }
 
 void HubFrame::OnUpdateFrameMenu(const CDocTemplate* front) {

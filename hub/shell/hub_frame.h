@@ -1,18 +1,20 @@
 #pragma once
 
 #include "hub/screen/qt_screen.h"
+#include "hub/shell/exchange.h"
 #include "hub/shell/plug_ins.h"
 #include "hub/shell/recent_files.h"
 #include "platform/foundation/frames.h"
 #include "platform/framework/application.h"
 
+#include <functional>
 #include <memory>
 #include <vector>
 
 namespace kota::hub {
 
-// The shell's main window: the documents of all editors, and the commands that belong to none of them. No
-// project is open, so the editors' requests for one, its rivers and a location are answered with nothing.
+// The shell's main window: the documents of all editors, the project that they belong to, and the commands
+// that belong to none of them.
 class HubFrame : public CKhMDIFrameWnd {
     DECLARE_DYNAMIC(HubFrame)
 public:
@@ -22,10 +24,22 @@ public:
 
     // Makes the templates and the tool bars of the plug-ins known.
     void load(PlugIns plugIns);
-    // Each with a box that says why, where one cannot be opened.
+    // Documents, and river networks, which are projects. Each with a box that says why, where one cannot be
+    // opened.
     void openFiles(const QStringList& paths);
+    // The documents that are open and have a file, in the order in which they were opened.
+    QStringList documents() const;
+
+    const Projects& projects() const { return projects_; }
+    Exchange& exchange() { return exchange_; }
+
+    // A project was opened or closed.
+    std::function<void()> onProject;
+    // The user ends the program: everything is still open, and may be, if the user changes their mind.
+    std::function<void()> onEnd;
 
     BOOL OnCmdMsg(UINT id, int notification) override;
+    void OnClose() override;
     void OnDropFiles(const std::vector<CString>& paths) override;
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 
@@ -36,10 +50,15 @@ protected:
 private:
     void OnFileNew();
     void OnFileOpen();
+    void OnProjectOpen();
+    void OnProjectClose();
+    void OnSettings();
     void OnExit();
     void OnAbout();
     bool OpenRecent(UINT id, int notification);
     void Open(const QString& path);
+    void OpenProject(const QString& path);
+    void ProjectChanged();
     bool HasEditorFor(const QString& path) const;
     // After a save of the document in front: its file may have got another name.
     void NoteSaved();
@@ -50,6 +69,8 @@ private:
     std::vector<PlugIn> plugIns_;
     std::vector<std::unique_ptr<CKhToolBarEx>> toolBars_;
     RecentFiles recent_;
+    Projects projects_;
+    Exchange exchange_{projects_};
     std::vector<QPixmap> editorPictures_;
 };
 

@@ -1,8 +1,10 @@
 #include "hub/screen/text.h"
-#include "hub/shell/hub_frame.h"
 #include "hub/shell/menu.h"
+#include "hub/shell/panels.h"
 #include "hub/shell/program_icon.h"
+#include "hub/shell/settings.h"
 #include "hub/shell/tour.h"
+#include "hub/shell/workspace.h"
 #include "platform/language/language.h"
 
 #include <QApplication>
@@ -21,7 +23,9 @@
 
 namespace {
 
+using kota::hub::HubFrame;
 using kota::hub::QtScreen;
+using kota::hub::Workspace;
 
 constexpr QSize firstSize(1280, 800);
 constexpr QSize leastSize(640, 440);
@@ -50,12 +54,12 @@ private:
 constexpr int english = 1033;
 constexpr int japanese = 1041;
 
-// What was asked for when the program was started, or else in its settings; 0 for the environment's.
-int wantedLanguage(const QString& asked) {
-    if (asked.isEmpty())
-        return QSettings().value("language", 0).toInt();
-    return asked == "ja" ? japanese : english;
-}
+// What the program was asked for when it was started.
+struct Start {
+    QStringList files;
+    int language = 0;   // 0 for the environment's
+    QString tourFolder; // empty for no tour
+};
 
 // Has the program, the platform and the toolkit speak the user's language, and in letters that show it.
 void speak(int language, const QtScreen& screen, QTranslator& toolkitTexts) {
@@ -72,26 +76,49 @@ void speak(int language, const QtScreen& screen, QTranslator& toolkitTexts) {
     }
 }
 
-int runHub(const QStringList& files, int language, const QString& tourFolder) {
+// As the user left it, or of the usual size.
+void placeWindow(QMainWindow& window, const Workspace& workspace, bool forPictures) {
+    window.setMinimumSize(leastSize);
+    if (!forPictures && workspace.restore(window))
+        return;
+    const QSize room = forPictures ? firstSize : window.screen()->availableSize();
+    window.resize(firstSize.boundedTo(room)); // pictures are of one size, whatever the display
+}
+
+// The last project, and what was asked for, or else the documents that were open.
+QStringList filesToOpen(const Workspace& workspace, const QStringList& asked) {
+    QStringList files = asked.isEmpty() ? workspace.documents : asked;
+    if (!workspace.project.isEmpty())
+        files.prepend(workspace.project);
+    return files;
+}
+
+int runHub(const Start& start) {
     CWinApp application;
     QtScreen screen;
     QTranslator toolkitTexts;
-    speak(language, screen, toolkitTexts);
+    speak(start.language, screen, toolkitTexts);
     kota::Screen* const before = kota::attachScreen(&screen);
     int result = 0;
     {
-        kota::hub::HubFrame frame(application, screen);
+        const Workspace workspace = Workspace::load();
+        HubFrame frame(application, screen);
         QMainWindow* const window = screen.makeMainWindow(frame);
-        window->setMinimumSize(leastSize);
-        const QSize room = tourFolder.isEmpty() ? window->screen()->availableSize() : firstSize;
-        window->resize(firstSize.boundedTo(room)); // pictures are of one size, whatever the display
+        const kota::hub::Panels panels(*window, frame, screen);
+        placeWindow(*window, workspace, !start.tourFolder.isEmpty());
         window->show();
+        frame.onEnd = [&] {
+            Workspace last{frame.projects().path(), frame.documents(), {}, {}};
+            last.take(*window);
+            last.save();
+        };
         screen.perform([&] { frame.load(kota::hub::loadPlugIns(kota::hub::plugInFolder())); });
-        if (tourFolder.isEmpty()) {
+        if (start.tourFolder.isEmpty()) {
+            const QStringList files = filesToOpen(workspace, start.files);
             AfterFirstPaint opening(*window, [&] { screen.perform([&] { frame.openFiles(files); }); });
             result = QApplication::exec();
         } else {
-            result = kota::hub::takeTour(frame, *window, files.value(0), tourFolder);
+            result = kota::hub::takeTour(frame, *window, start.files.value(0), start.tourFolder);
         }
     }
     kota::attachScreen(before);
@@ -140,5 +167,8 @@ int main(int argc, char** argv) {
         QTextStream(stderr) << "There are no texts in '" << asked << "': en or ja is expected." << Qt::endl;
         return 1;
     }
-    return runHub(options.positionalArguments(), wantedLanguage(asked), options.value(tour));
+    const auto settings = kota::hub::Settings::load();
+    settings.applyUnits();
+    const int chosen = asked.isEmpty() ? settings.language : asked == "ja" ? japanese : english;
+    return runHub({options.positionalArguments(), chosen, options.value(tour)});
 }

@@ -1,5 +1,6 @@
 #include "hub/shell/menu.h"
 
+#include "hub/project/project_texts.h"
 #include "hub/screen/text.h"
 #include "platform/framework/messages.h"
 #include "platform/language/language.h"
@@ -26,6 +27,7 @@ const Module& hubModule() {
 
 void loadLanguage() {
     loadPlatformTexts();
+    loadProjectTexts();
     KhLangLoadResDll("kota_hub", &record.resources, 0);
 }
 

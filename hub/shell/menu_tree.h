@@ -1,5 +1,6 @@
 #pragma once
 
+#include "hub/shell/commands.h"
 #include "platform/framework/messages.h"
 #include "platform/framework/module.h"
 
@@ -14,7 +15,10 @@ struct MenuTexts {
     const char* fileSave;
     const char* fileSaveAs;
     const char* recentFile;
+    const char* openProject;
+    const char* closeProject;
     const char* dataUtility;
+    const char* settings;
     const char* exit;
     const char* edit;
     const char* undo;
@@ -24,6 +28,8 @@ struct MenuTexts {
     const char* view;
     const char* toolbar;
     const char* statusBar;
+    const char* riverMap;
+    const char* exchange;
     const char* window;
     const char* newWindow;
     const char* cascade;
@@ -36,8 +42,6 @@ struct MenuTexts {
 // The menu with the texts of a language.
 template <const MenuTexts& text>
 class MenuTree {
-    static constexpr UINT dataUtility = 32773;
-
     static constexpr MenuItemTemplate fileItems[] = {
         {ID_FILE_NEW, text.fileNew},
         {ID_FILE_OPEN, text.fileOpen},
@@ -47,7 +51,11 @@ class MenuTree {
         {},
         {ID_FILE_MRU_FILE1, text.recentFile, true},
         {},
-        {dataUtility, text.dataUtility, true},
+        {HubCommand::OpenProject, text.openProject},
+        {HubCommand::CloseProject, text.closeProject},
+        {},
+        {HubCommand::DataUtility, text.dataUtility, true},
+        {HubCommand::Settings, text.settings},
         {},
         {ID_APP_EXIT, text.exit},
     };
@@ -58,8 +66,8 @@ class MenuTree {
     };
 
     static constexpr MenuItemTemplate viewItems[] = {
-        {ID_VIEW_TOOLBAR, text.toolbar},
-        {ID_VIEW_STATUS_BAR, text.statusBar},
+        {ID_VIEW_TOOLBAR, text.toolbar},      {ID_VIEW_STATUS_BAR, text.statusBar},      {},
+        {HubCommand::ShowMap, text.riverMap}, {HubCommand::ShowExchange, text.exchange},
     };
 
     static constexpr MenuItemTemplate windowItems[] = {

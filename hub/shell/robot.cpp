@@ -1,6 +1,9 @@
 #include "hub/shell/robot.h"
 
+#include "hub/project/river_map.h"
+
 #include <QApplication>
+#include <QDockWidget>
 #include <QLineEdit>
 #include <QMenuBar>
 #include <QMessageBox>
@@ -112,6 +115,15 @@ void Robot::clickCell(int line, int column) {
     const QModelIndex cell = grid.model()->index(line - 1, column - 1);
     grid.scrollTo(cell);
     click(*grid.viewport(), grid.visualRect(cell).center());
+}
+
+void Robot::clickMap(const QString& river, double chainage) {
+    auto* const panel = window_.findChild<QDockWidget*>("map");
+    auto* const map = panel ? static_cast<RiverMap*>(panel->widget()) : nullptr;
+    const auto place = map ? map->network().place(river, chainage) : std::nullopt;
+    if (!place)
+        throw missing("place on the map");
+    click(*map, map->viewPort().toScreen(*place).toPoint());
 }
 
 void Robot::choose(UINT command) {

@@ -29,6 +29,8 @@ public:
     int lineCount() const;
     // A cell of the grid in front, lines and columns from 1.
     void clickCell(int line, int column);
+    // A place of a river on the map.
+    void clickMap(const QString& river, double chainage);
     // The entry of a command in the menu bar.
     void choose(UINT command);
     // Writes into a field of the page in front, counted from 1, in place of what it holds.

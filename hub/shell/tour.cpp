@@ -21,6 +21,8 @@ constexpr int components = 0;
 constexpr int dispersion = 1;
 constexpr int decay = 4;
 constexpr int minimumCoefficient = 3;
+// On the first river of the example, in metres: Omaha.
+constexpr double placeOnMap = 187328;
 
 class Tour {
 public:
@@ -35,11 +37,13 @@ public:
         QFile::remove(copy_);
         if (!QFile::copy(document, copy_))
             throw std::runtime_error(("cannot copy " + document + " to " + copy_).toStdString());
+        openProject(QFileInfo(document).dir().filePath("network.geojson"));
         open("The example is open");
         visitTabs();
         renameComponent();
         insertDecayLine();
         breachBounds();
+        insertPickedPlace();
         saveAndReopen();
     }
 
@@ -62,6 +66,16 @@ private:
         robot_.settle();
         expect(frame_.MDIGetActive() != nullptr, "the document did not open");
         step(what);
+    }
+
+    // The one beside the document, if there is one.
+    void openProject(const QString& network) {
+        if (!QFileInfo::exists(network))
+            return;
+        frame_.openFiles({network});
+        robot_.settle();
+        expect(frame_.projects().isOpen(), "the project did not open");
+        step("The project is open");
     }
 
     void visitTabs() {
@@ -111,6 +125,22 @@ private:
         robot_.fill(minimumCoefficient, "10");
         step("The minimum is mended");
         robot_.clickTab(decay);
+    }
+
+    void insertPickedPlace() {
+        if (!frame_.projects().isOpen())
+            return;
+        const QString river = frame_.projects().network()->names().first();
+        robot_.clickTab(dispersion);
+        robot_.clickCell(robot_.lineCount(), 3);
+        step("The map shows where the user is");
+        robot_.clickMap(river, placeOnMap);
+        step("A place is picked on the map");
+        robot_.clickTab(decay);
+        robot_.clickCell(1, 2);
+        robot_.press(Qt::Key_Insert);
+        expect(frame_.exchange().offered().has_value(), "no place was picked");
+        step("A decay line is inserted at that place");
     }
 
     void saveAndReopen() {

@@ -88,6 +88,14 @@ TEST_F(AMouseSelection, StaysBelowTheHeaderLines) {
     release(centre(1, 4));
 }
 
+TEST_F(ShownGrid, HasRoomForTheNumberOfItsLastLine) {
+    grid.SetRowCount(1234567);
+    show();
+
+    const QHeaderView& numbers = *view().verticalHeader();
+    EXPECT_GE(numbers.width(), numbers.fontMetrics().horizontalAdvance("1234567"));
+}
+
 TEST_F(AMouseSelection, SelectsTheLinesWhoseHeadersTheMouseIsDraggedOver) {
     drag(lineHead(3), lineHead(6));
     std::vector<ROWCOL> lines;

@@ -151,6 +151,17 @@ TEST_F(TheShell, TakesNoTourInTheFolderOfTheDocument) {
     EXPECT_EQ(readFile(path), before);
 }
 
+TEST_F(TheShell, EndsItsTourAtABoxThatNobodyExpects) {
+    const std::string path = folder.write("river.AD31", "this is no document\n");
+    leaveBoxes();
+
+    const int result = kota::hub::takeTour(shell.frame, *shell.window, QString::fromStdString(path),
+                                           QString::fromStdString(folder.file("pictures")));
+
+    EXPECT_EQ(result, 1);
+    EXPECT_EQ(QApplication::activeModalWidget(), nullptr) << "it is closed";
+}
+
 TEST_F(TheShell, TypesNothingIntoAWindowThatIsReducedToAnIcon) {
     open(copyExample());
     clickTab("Components");
@@ -201,6 +212,23 @@ protected:
     // Clicks behind the text.
     void clickInto(QLineEdit& line) { click(line, line.rect().center()); }
 };
+
+TEST_F(AField, IsScrolledIntoViewWhereThereIsLittleRoom) {
+    shell.window->resize(640, 300);
+    clickTab("Dispersion");
+    settle();
+    const QRect seen(0, 0, grid().width(), grid().height());
+    EXPECT_GT(seen.height(), 80) << "a few lines have room";
+    QLineEdit& first = field("Dispersion factor");
+
+    first.setFocus();
+    settle();
+    EXPECT_EQ(first.visibleRegion().boundingRect(), first.rect());
+    grid().setFocus();
+    settle();
+
+    EXPECT_FALSE(grid().visibleRegion().isEmpty());
+}
 
 TEST_F(AField, KeepsAValueThatIsLongerThanWhatCanBeTyped) {
     document().globalVar.G_max_disp_coef = 1e20;

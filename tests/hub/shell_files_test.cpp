@@ -50,6 +50,21 @@ TEST_F(RecentlyUsedFiles, AreListedWithADocumentInFrontToo) {
     EXPECT_THAT(listed(), ElementsAre("a.AD31"));
 }
 
+TEST_F(RecentlyUsedFiles, AreListedWithoutTheMiddleOfALongPath) {
+    const std::string deep = std::string(40, 'a') + "/" + std::string(40, 'b') + "/" + std::string(40, 'c');
+    std::filesystem::create_directories(folder.path() / deep);
+    open(copyExample(deep + "/river.AD31"));
+    QString text;
+    for (const QAction* const action : menu("File").actions())
+        if (textOf(*action).startsWith("1 "))
+            text = textOf(*action);
+
+    EXPECT_TRUE(text.startsWith("1 river.AD31 - " + QString::fromStdString(folder.path().string()).left(5)));
+    EXPECT_TRUE(text.contains("..."));
+    EXPECT_TRUE(text.endsWith("ccc"));
+    EXPECT_LT(text.size(), 90);
+}
+
 TEST_F(RecentlyUsedFiles, OpenByTheirEntries) {
     openAndClose("a.AD31");
     openAndClose("b.AD31");

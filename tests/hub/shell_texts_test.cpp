@@ -1,3 +1,4 @@
+#include "hub/project/project_texts.h"
 #include "hub/shell/texts.h"
 #include "tests/support/translation.h"
 
@@ -9,6 +10,16 @@ TEST(TheShellsJapaneseTexts, StandForEachString) {
     const LoadedTexts japanese(KOTA_HUB_1041);
 
     expectTranslated(*japanese, kota::hub::englishTexts());
+}
+
+TEST(TheShellsJapaneseTexts, StandForEachStringOfAProject) {
+    const LoadedTexts japanese(KOTA_PROJECT_1041);
+
+    using kota::hub::ProjectText;
+    std::vector<UINT> same;
+    for (const ProjectText text : {ProjectText::Within, ProjectText::Place, ProjectText::Metres})
+        same.push_back(static_cast<UINT>(text));
+    expectTranslated(*japanese, kota::hub::englishProjectTexts(), same);
 }
 
 TEST(TheShellsJapaneseTexts, StandInTheMenu) {

@@ -90,6 +90,8 @@ public:
             QTest::keyClick(name, Qt::Key_Return);
         });
     }
+    // Leaves boxes to somebody else from now on.
+    void leaveBoxes() { watch_.stop(); }
     // The words of the boxes shown so far, and the titles of other dialogs.
     const std::vector<std::string>& boxes() const { return boxes_; }
 

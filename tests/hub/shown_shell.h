@@ -4,6 +4,7 @@
 #include "hub/screen/grid_view.h"
 #include "hub/screen/qt_screen.h"
 #include "hub/shell/hub_frame.h"
+#include "hub/shell/panels.h"
 #include "platform/framework/application.h"
 #include "platform/framework/document.h"
 #include "tests/hub/shell_user.h"
@@ -42,6 +43,7 @@ struct RunningShell {
     RunningShell() : before(attachScreen(&screen)), frame(application, screen) {
         forgetEndBefore();
         window = screen.makeMainWindow(frame);
+        panels.emplace(*window, frame, screen);
         window->resize(1280, 800);
         window->show();
         window->activateWindow();
@@ -56,6 +58,7 @@ struct RunningShell {
     Screen* before;
     hub::HubFrame frame;
     QPointer<QMainWindow> window;
+    std::optional<hub::Panels> panels;
 
 private:
     // A shell that ended has told the toolkit to leave its event loops, also those that come later.

@@ -1,0 +1,87 @@
+#include "hub/project/map_labels.h"
+
+#include <QFontMetricsF>
+#include <QSet>
+
+#include <algorithm>
+#include <array>
+
+namespace kota::hub {
+
+namespace {
+
+constexpr double leastNamed = 24;      // pixels of a river in view
+constexpr std::size_t mostNamed = 250; // names are tried
+constexpr double nameDistance = 7;     // pixels from a line
+
+// Where on its river a name is tried, in this order.
+constexpr std::array shares = {0.5, 0.38, 0.62, 0.26, 0.74, 0.14, 0.86};
+
+std::vector<const DrawnStretch*> longestFirst(const std::vector<DrawnStretch>& stretches) {
+    std::vector<const DrawnStretch*> longest;
+    for (const DrawnStretch& stretch : stretches)
+        if (stretch.length() >= leastNamed)
+            longest.push_back(&stretch);
+    std::ranges::stable_sort(longest, [](const DrawnStretch* left, const DrawnStretch* right) {
+        return left->length() > right->length();
+    });
+    if (longest.size() > mostNamed)
+        longest.resize(mostNamed);
+    return longest;
+}
+
+std::optional<QRectF> placeOf(QSizeF name, const DrawnStretch& stretch, const LabelPlaces& places,
+                              LabelPlaces::On on) {
+    for (const double share : shares) {
+        const double along = share * stretch.length();
+        const QPointF direction = stretch.directionAt(along);
+        const QPointF right(-direction.y(), direction.x());
+        for (const QPointF side : {right, -right}) {
+            const QRectF rect = besideOf(stretch.pointAt(along), side, nameDistance, name);
+            if (places.isFree(rect, on))
+                return rect;
+        }
+    }
+    return std::nullopt;
+}
+
+} // namespace
+
+void paintLabel(QPainter& painter, const QRectF& rect, const QString& text, const QColor& ground) {
+    const QPen pen = painter.pen();
+    painter.setPen(ground);
+    for (const QPointF shift : {QPointF(-1, -1), QPointF(1, -1), QPointF(-1, 1), QPointF(1, 1)})
+        painter.drawText(rect.translated(shift), Qt::AlignCenter | Qt::TextDontClip, text);
+    painter.setPen(pen);
+    painter.drawText(rect, Qt::AlignCenter | Qt::TextDontClip, text);
+}
+
+QRectF besideOf(QPointF place, QPointF towards, double distance, QSizeF size) {
+    const double reach =
+        distance + std::abs(towards.x()) * size.width() / 2 + std::abs(towards.y()) * size.height() / 2;
+    QRectF rect(QPointF(), size);
+    rect.moveCenter(place + towards * reach);
+    return rect;
+}
+
+void paintRiverNames(QPainter& painter, const Network& network, const std::vector<DrawnStretch>& stretches,
+                     LabelPlaces& places, const QColor& ground) {
+    const QFontMetricsF metrics(painter.font());
+    QSet<QString> named;
+    for (const DrawnStretch* stretch : longestFirst(stretches)) {
+        const QString& name = network.rivers()[stretch->river].name;
+        if (named.contains(name))
+            continue;
+        const QSizeF size(metrics.horizontalAdvance(name) + 2, metrics.height());
+        std::optional<QRectF> rect = placeOf(size, *stretch, places, LabelPlaces::On::Nothing);
+        if (!rect && stretch->length() > size.width())
+            rect = placeOf(size, *stretch, places, LabelPlaces::On::LinesAtMost);
+        if (!rect)
+            continue;
+        paintLabel(painter, *rect, name, ground);
+        places.take(*rect);
+        named.insert(name);
+    }
+}
+
+} // namespace kota::hub
