@@ -10,10 +10,8 @@ namespace kota::hub {
 
 namespace {
 
-constexpr double leastApart = 64;  // pixels between marks
-constexpr double leastMarked = 28; // pixels of a river in view
-constexpr double tick = 4.5;       // pixels to both sides of the line
-constexpr double labelDistance = 7;
+constexpr double leastApart = 64; // pixels between marks
+constexpr double tick = 4.5;      // pixels to both sides of the line
 
 // Metres of chainage for so many pixels. A stretch drawn nearly to scale goes by the map's scale, so that
 // rivers beside each other have the same step.
@@ -25,7 +23,7 @@ double chainageOf(double pixels, const DrawnStretch& stretch, double scale) {
 }
 
 bool hasMarks(const DrawnStretch& stretch) {
-    return stretch.length() >= leastMarked && stretch.chainages.front() != stretch.chainages.back();
+    return stretch.length() > 0 && stretch.chainages.front() != stretch.chainages.back();
 }
 
 } // namespace
@@ -43,9 +41,10 @@ std::vector<double> ChainageMarks::multiples(double shift) const {
     if (step_ <= 0)
         return found;
     const auto [least, most] = std::minmax({stretch_.chainages.front(), stretch_.chainages.back()});
-    const double last = std::floor(most / step_ - shift);
-    for (double number = std::ceil(least / step_ - shift); number <= last; ++number)
-        found.push_back((number + shift) * step_ + 0.0);
+    const double first = std::ceil(least / step_ - shift);
+    const int count = static_cast<int>(std::floor(most / step_ - shift) - first) + 1;
+    for (int number = 0; number < count; ++number)
+        found.push_back((first + number + shift) * step_ + 0.0);
     return found;
 }
 
@@ -87,13 +86,9 @@ void paintMarks(QPainter& painter, const MapScene& scene, const MapColours& colo
         painter.setPen(colours.markText);
         const QString text = scene.chainages.text(chainage);
         const QSizeF size(metrics.horizontalAdvance(text) + 2, metrics.height());
-        for (const QPointF side : {aside, -aside}) {
-            const QRectF rect = besideOf(place, side, labelDistance, size);
-            if (!places.isFree(rect))
-                continue;
-            paintLabel(painter, rect, text, colours.ground);
-            places.take(rect);
-            break;
+        if (const std::optional<QRectF> rect = placeBeside(stretch, along, size, places)) {
+            painter.drawText(*rect, Qt::AlignCenter | Qt::TextDontClip, text);
+            places.take(*rect);
         }
     }
 }

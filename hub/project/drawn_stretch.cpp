@@ -1,5 +1,7 @@
 #include "hub/project/drawn_stretch.h"
 
+#include <QRectF>
+
 #include <functional>
 
 namespace kota::hub {
@@ -38,12 +40,24 @@ QPointF between(QPointF first, QPointF second, double part) {
     return {std::lerp(first.x(), second.x(), part), std::lerp(first.y(), second.y(), part)};
 }
 
+// The second of the two values between which one lies in a rising or falling row.
+template <typename Before>
+std::size_t behind(std::span<const double> row, double value, Before isBefore) {
+    const auto found = std::lower_bound(row.begin() + 1, row.end() - 1, value, isBefore);
+    return static_cast<std::size_t>(found - row.begin());
+}
+
+double partOf(double from, double to, double value) {
+    return to == from ? 0 : std::clamp((value - from) / (to - from), 0.0, 1.0);
+}
+
+} // namespace
+
 // Puts the stretches of one river together, segment by segment.
 class Stretcher {
 public:
-    Stretcher(const River& river, std::size_t place, const Drawing& drawing,
-              std::vector<DrawnStretch>& stretches)
-        : river_(river), place_(place), drawing_(drawing), stretches_(stretches) {
+    Stretcher(const Network& network, std::size_t place, const Drawing& drawing, DrawnStretches& stretches)
+        : river_(network.rivers()[place]), place_(place), drawing_(drawing), to_(stretches) {
         const QSizeF size = drawing.port.size();
         const double margin = drawing.margin;
         view_ = QRectF(-margin, -margin, size.width() + 2 * margin, size.height() + 2 * margin);
@@ -86,33 +100,35 @@ private:
 
     void open(QPointF point, double chainage) {
         isOpen_ = true;
-        stretches_.push_back({place_, {point}, {chainage}, {0}});
+        to_.beginnings_.push_back({place_, to_.points_.size()});
+        keep(point, chainage, 0);
         last_ = point;
         lastChainage_ = chainage;
     }
     void extend(QPointF point, double chainage) {
         last_ = point;
         lastChainage_ = chainage;
-        if ((point - stretches_.back().points.constLast()).manhattanLength() >= drawing_.closest)
+        if ((point - to_.points_.back()).manhattanLength() >= drawing_.closest)
             keepLast();
     }
     void keepLast() {
-        DrawnStretch& stretch = stretches_.back();
-        const QPointF step = last_ - stretch.points.constLast();
-        const bool isThere = stretch.points.size() > 1 && step.isNull();
-        if (isThere) {
-            stretch.chainages.back() = lastChainage_;
-            return;
-        }
-        stretch.points.append(last_);
-        stretch.chainages.push_back(lastChainage_);
-        stretch.along.push_back(stretch.along.back() + std::hypot(step.x(), step.y()));
+        const QPointF step = last_ - to_.points_.back();
+        const bool isAlone = to_.points_.size() == to_.beginnings_.back().point + 1;
+        if (isAlone || !step.isNull())
+            keep(last_, lastChainage_, to_.along_.back() + std::sqrt(QPointF::dotProduct(step, step)));
+        else
+            to_.chainages_.back() = lastChainage_;
+    }
+    void keep(QPointF point, double chainage, double along) {
+        to_.points_.push_back(point);
+        to_.chainages_.push_back(chainage);
+        to_.along_.push_back(along);
     }
 
     const River& river_;
     std::size_t place_;
     const Drawing& drawing_;
-    std::vector<DrawnStretch>& stretches_;
+    DrawnStretches& to_;
     QRectF view_;
     std::size_t next_ = 0; // the segment behind the last one
     bool isOpen_ = false;
@@ -120,23 +136,9 @@ private:
     double lastChainage_ = 0;
 };
 
-// The second of the two values between which one lies in a rising or falling row.
-template <typename Before>
-std::size_t behind(const std::vector<double>& row, double value, Before isBefore) {
-    const auto found = std::lower_bound(row.begin() + 1, row.end() - 1, value, isBefore);
-    return static_cast<std::size_t>(found - row.begin());
-}
-
-double partOf(double from, double to, double value) {
-    return to == from ? 0 : std::clamp((value - from) / (to - from), 0.0, 1.0);
-}
-
-} // namespace
-
 QPointF DrawnStretch::pointAt(double length) const {
     const std::size_t second = behind(along, length, std::less<>());
-    return between(points[static_cast<qsizetype>(second) - 1], points[static_cast<qsizetype>(second)],
-                   partOf(along[second - 1], along[second], length));
+    return between(points[second - 1], points[second], partOf(along[second - 1], along[second], length));
 }
 
 QPointF DrawnStretch::directionAt(double length) const {
@@ -152,13 +154,22 @@ double DrawnStretch::lengthAt(double chainage) const {
                      partOf(chainages[second - 1], chainages[second], chainage));
 }
 
-void addStretches(const Network& network, std::size_t river, const Drawing& drawing,
-                  std::vector<DrawnStretch>& stretches) {
-    Stretcher stretcher(network.rivers()[river], river, drawing, stretches);
-    network.indexOf(river).stretchesIn(
-        drawing.port.seen(drawing.margin),
-        [&stretcher](std::size_t first, std::size_t end) { stretcher.add(first, end); });
-    stretcher.finish();
+DrawnStretches::DrawnStretches(const Network& network, const Drawing& drawing) {
+    const Box seen = drawing.port.seen(drawing.margin);
+    for (std::size_t river = 0; river < network.rivers().size(); ++river) {
+        Stretcher stretcher(network, river, drawing, *this);
+        network.indexOf(river).stretchesIn(
+            seen, [&stretcher](std::size_t first, std::size_t end) { stretcher.add(first, end); });
+        stretcher.finish();
+    }
+}
+
+DrawnStretch DrawnStretches::operator[](std::size_t stretch) const {
+    const std::size_t first = beginnings_[stretch].point;
+    const std::size_t end = stretch + 1 < size() ? beginnings_[stretch + 1].point : points_.size();
+    const std::size_t count = end - first;
+    return {beginnings_[stretch].river, std::span(points_).subspan(first, count),
+            std::span(chainages_).subspan(first, count), std::span(along_).subspan(first, count)};
 }
 
 } // namespace kota::hub

@@ -4,6 +4,7 @@
 #include <QRectF>
 #include <QSizeF>
 
+#include <cstddef>
 #include <cstdint>
 #include <vector>
 
@@ -17,6 +18,7 @@ public:
 
     enum class On { Nothing, LinesAtMost };
 
+    // Shorter than a million squares.
     void takeLine(const QLineF& line);
     void take(const QRectF& label);
     // Whether a label lies within the picture and on nothing that it must not cover.
@@ -26,14 +28,14 @@ private:
     enum Use : std::uint8_t { Line = 1, Label = 2 };
 
     struct Squares {
-        int left, top, right, bottom; // the last ones belong to it
+        std::size_t left, top, right, bottom; // the last ones belong to it
     };
     Squares squaresOf(const QRectF& rect) const;
-    std::uint8_t& at(int column, int row) { return uses_[static_cast<std::size_t>(row * columns_ + column)]; }
+    std::size_t placeOf(std::size_t column, std::size_t row) const { return row * columns_ + column; }
 
     QRectF picture_;
-    int columns_;
-    int rows_;
+    std::size_t columns_;
+    std::size_t rows_;
     std::vector<std::uint8_t> uses_;
 };
 

@@ -10,9 +10,9 @@ namespace kota::hub {
 
 namespace {
 
-constexpr double leastNamed = 24;      // pixels of a river in view
-constexpr std::size_t mostNamed = 250; // names are tried
-constexpr double nameDistance = 7;     // pixels from a line
+constexpr double leastNamed = 24;             // pixels of a river in view
+constexpr std::size_t mostNamed = 250;        // names are tried
+constexpr std::array distances = {7.0, 13.0}; // pixels from a line
 
 // Where on its river a name is tried, in this order.
 constexpr std::array shares = {0.5, 0.38, 0.62, 0.26, 0.74, 0.14, 0.86};
@@ -32,36 +32,44 @@ std::vector<const DrawnStretch*> longestFirst(const std::vector<DrawnStretch>& s
 
 std::optional<QRectF> placeOf(QSizeF name, const DrawnStretch& stretch, const LabelPlaces& places,
                               LabelPlaces::On on) {
-    for (const double share : shares) {
-        const double along = share * stretch.length();
-        const QPointF direction = stretch.directionAt(along);
-        const QPointF right(-direction.y(), direction.x());
-        for (const QPointF side : {right, -right}) {
-            const QRectF rect = besideOf(stretch.pointAt(along), side, nameDistance, name);
-            if (places.isFree(rect, on))
-                return rect;
-        }
-    }
+    for (const double share : shares)
+        if (const std::optional<QRectF> rect =
+                placeBeside(stretch, share * stretch.length(), name, places, on))
+            return rect;
     return std::nullopt;
 }
 
-} // namespace
-
-void paintLabel(QPainter& painter, const QRectF& rect, const QString& text, const QColor& ground) {
-    const QPen pen = painter.pen();
-    painter.setPen(ground);
-    for (const QPointF shift : {QPointF(-1, -1), QPointF(1, -1), QPointF(-1, 1), QPointF(1, 1)})
-        painter.drawText(rect.translated(shift), Qt::AlignCenter | Qt::TextDontClip, text);
-    painter.setPen(pen);
-    painter.drawText(rect, Qt::AlignCenter | Qt::TextDontClip, text);
-}
-
+// The rectangle for a text beside a place, so many pixels off it to one side.
 QRectF besideOf(QPointF place, QPointF towards, double distance, QSizeF size) {
     const double reach =
         distance + std::abs(towards.x()) * size.width() / 2 + std::abs(towards.y()) * size.height() / 2;
     QRectF rect(QPointF(), size);
     rect.moveCenter(place + towards * reach);
     return rect;
+}
+
+void paintEdge(QPainter& painter, const QRectF& rect, const QString& text, const QColor& ground) {
+    const QPen pen = painter.pen();
+    painter.setPen(ground);
+    for (const QPointF shift : {QPointF(-1, -1), QPointF(1, -1), QPointF(-1, 1), QPointF(1, 1)})
+        painter.drawText(rect.translated(shift), Qt::AlignCenter | Qt::TextDontClip, text);
+    painter.setPen(pen);
+}
+
+} // namespace
+
+std::optional<QRectF> placeBeside(const DrawnStretch& stretch, double along, QSizeF text,
+                                  const LabelPlaces& places, LabelPlaces::On on) {
+    const QPointF place = stretch.pointAt(along);
+    const QPointF direction = stretch.directionAt(along);
+    const QPointF right(-direction.y(), direction.x());
+    for (const double distance : distances)
+        for (const QPointF side : {QPointF(1, 0), QPointF(-1, 0), right, -right}) {
+            const QRectF rect = besideOf(place, side, distance, text);
+            if (places.isFree(rect, on))
+                return rect;
+        }
+    return std::nullopt;
 }
 
 void paintRiverNames(QPainter& painter, const Network& network, const std::vector<DrawnStretch>& stretches,
@@ -74,11 +82,14 @@ void paintRiverNames(QPainter& painter, const Network& network, const std::vecto
             continue;
         const QSizeF size(metrics.horizontalAdvance(name) + 2, metrics.height());
         std::optional<QRectF> rect = placeOf(size, *stretch, places, LabelPlaces::On::Nothing);
-        if (!rect && stretch->length() > size.width())
+        if (!rect && stretch->length() > size.width()) {
             rect = placeOf(size, *stretch, places, LabelPlaces::On::LinesAtMost);
+            if (rect)
+                paintEdge(painter, *rect, name, ground);
+        }
         if (!rect)
             continue;
-        paintLabel(painter, *rect, name, ground);
+        painter.drawText(*rect, Qt::AlignCenter | Qt::TextDontClip, name);
         places.take(*rect);
         named.insert(name);
     }

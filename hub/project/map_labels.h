@@ -10,12 +10,10 @@
 
 namespace kota::hub {
 
-// A text beside a place, in a colour of its own; an edge in the colour of the ground keeps it readable on
-// lines.
-void paintLabel(QPainter& painter, const QRectF& rect, const QString& text, const QColor& ground);
-
-// The rectangle for a text of a size beside a place, `distance` pixels off it to one side.
-QRectF besideOf(QPointF place, QPointF towards, double distance, QSizeF size);
+// The first free one of the places of a text beside a point of a stretch: to its right, to its left, and off
+// the line to both sides, closer first.
+std::optional<QRectF> placeBeside(const DrawnStretch& stretch, double along, QSizeF text,
+                                  const LabelPlaces& places, LabelPlaces::On on = LabelPlaces::On::Nothing);
 
 // Names each river beside its line, horizontally, where there is room; the longest in view go first, and one
 // name stands once for all reaches. Takes the places of the names.

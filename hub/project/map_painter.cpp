@@ -8,6 +8,7 @@
 
 #include <QPainter>
 
+#include <algorithm>
 #include <cmath>
 
 namespace kota::hub {
@@ -15,36 +16,49 @@ namespace kota::hub {
 namespace {
 
 constexpr double drawnAround = 8;    // pixels around the view, for the width of the lines
-constexpr std::size_t crowd = 1'500; // from so many stretches in view on, they are drawn as thin as can be
-constexpr double smallText = 0.88;
+constexpr double few = 60;           // stretches in view do not crowd
+constexpr double leastLabelled = 24; // pixels
+constexpr double nameSize = 1.1;     // of the font's size
+constexpr double markSize = 0.88;
 
-std::vector<DrawnStretch> stretchesInView(const MapScene& scene) {
-    const Drawing drawing{scene.port, drawnAround, 1 / scene.pixelRatio};
-    const Box seen = scene.port.seen(drawnAround);
-    std::vector<DrawnStretch> stretches;
-    for (std::size_t river = 0; river < scene.network.rivers().size(); ++river)
-        if (scene.network.indexOf(river).bounds().meets(seen))
-            addStretches(scene.network, river, drawing, stretches);
-    return stretches;
+DrawnStretches stretchesInView(const MapScene& scene) {
+    return {scene.network, {scene.port, drawnAround, 1 / scene.pixelRatio}};
 }
 
+// Those long enough for a name, marks and arrows.
+std::vector<DrawnStretch> labelled(const DrawnStretches& stretches) {
+    std::vector<DrawnStretch> found;
+    for (std::size_t stretch = 0; stretch < stretches.size(); ++stretch)
+        if (const DrawnStretch drawn = stretches[stretch]; drawn.length() >= leastLabelled)
+            found.push_back(drawn);
+    return found;
+}
+
+// Wider when the map is larger, and narrower where many lines are in view.
 double lineWidth(const MapScene& scene, std::size_t stretches) {
-    if (stretches > crowd)
-        return 1;
-    return std::clamp(2.2 + 0.7 * std::log2(scene.port.magnification()), 1.4, 6.0);
+    const double alone = std::clamp(2.2 + 0.7 * std::log2(scene.port.magnification()), 1.4, 6.0);
+    const double share = std::sqrt(few / std::max(static_cast<double>(stretches), few));
+    return std::max(alone * share, 1.0);
 }
 
-QFont nameFont(const MapScene& scene) {
-    QFont font = scene.font;
-    font.setItalic(true);
-    font.setLetterSpacing(QFont::PercentageSpacing, 104);
+// Where corners cannot be seen, they are not rounded, which costs the most.
+QPen linePen(const QColor& colour, double width) {
+    const bool isThin = width < 2;
+    return {colour, width, Qt::SolidLine, isThin ? Qt::FlatCap : Qt::RoundCap,
+            isThin ? Qt::BevelJoin : Qt::RoundJoin};
+}
+
+// A font given in pixels keeps its size.
+QFont sized(QFont font, double share) {
+    if (font.pointSizeF() > 0)
+        font.setPointSizeF(font.pointSizeF() * share);
     return font;
 }
 
-QFont markFont(const MapScene& scene) {
-    QFont font = scene.font;
-    if (font.pointSizeF() > 0)
-        font.setPointSizeF(font.pointSizeF() * smallText);
+QFont nameFont(const MapScene& scene) {
+    QFont font = sized(scene.font, nameSize);
+    font.setItalic(true);
+    font.setLetterSpacing(QFont::PercentageSpacing, 104);
     return font;
 }
 
@@ -53,7 +67,7 @@ class MapPainter {
 public:
     MapPainter(QPainter& painter, const MapScene& scene)
         : painter_(painter), scene_(scene), colours_(scene.palette), places_(scene.port.size()),
-          stretches_(stretchesInView(scene)), scaleBar_(scene) {
+          stretches_(stretchesInView(scene)), labelled_(labelled(stretches_)), scaleBar_(scene) {
         if (scene.picked)
             pin_.emplace(scene, *scene.picked);
         painter.setRenderHint(QPainter::Antialiasing);
@@ -77,35 +91,40 @@ private:
             places_.take(pin_->textRect());
             places_.take(pin_->rect());
         }
-        for (const DrawnStretch& stretch : stretches_)
-            for (qsizetype point = 1; point < stretch.points.size(); ++point)
-                places_.takeLine({stretch.points[point - 1], stretch.points[point]});
+        if (labelled_.empty())
+            return;
+        for (std::size_t stretch = 0; stretch < stretches_.size(); ++stretch) {
+            const DrawnStretch drawn = stretches_[stretch];
+            for (std::size_t point = 1; point < drawn.points.size(); ++point)
+                places_.takeLine({drawn.points[point - 1], drawn.points[point]});
+        }
     }
 
     void paintLines() {
         const double width = lineWidth(scene_, stretches_.size());
-        painter_.setPen(QPen(colours_.river, width, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
-        for (const DrawnStretch& stretch : stretches_)
-            paintLine(stretch);
+        painter_.setPen(linePen(colours_.river, width));
+        painter_.setBrush(Qt::NoBrush);
+        for (std::size_t stretch = 0; stretch < stretches_.size(); ++stretch)
+            paintLine(stretches_[stretch]);
         painter_.setPen(Qt::NoPen);
         painter_.setBrush(colours_.riverName);
-        for (const DrawnStretch& stretch : stretches_)
+        for (const DrawnStretch& stretch : labelled_)
             paintArrows(painter_, scene_, stretch, 4 + 0.6 * width);
     }
 
     void paintLine(const DrawnStretch& stretch) {
         if (stretch.length() > 0)
-            painter_.drawPolyline(stretch.points);
+            painter_.drawPolyline(stretch.points.data(), static_cast<int>(stretch.points.size()));
         else
-            painter_.drawPoint(stretch.points.constFirst());
+            painter_.drawEllipse(stretch.points.front(), 1.5, 1.5);
     }
 
     void paintLabels() {
         painter_.setFont(nameFont(scene_));
         painter_.setPen(colours_.riverName);
-        paintRiverNames(painter_, scene_.network, stretches_, places_, colours_.ground);
-        painter_.setFont(markFont(scene_));
-        for (const DrawnStretch& stretch : stretches_)
+        paintRiverNames(painter_, scene_.network, labelled_, places_, colours_.ground);
+        painter_.setFont(sized(scene_.font, markSize));
+        for (const DrawnStretch& stretch : labelled_)
             paintMarks(painter_, scene_, colours_, stretch, places_);
     }
 
@@ -113,7 +132,8 @@ private:
     const MapScene& scene_;
     MapColours colours_;
     LabelPlaces places_;
-    std::vector<DrawnStretch> stretches_;
+    DrawnStretches stretches_;
+    std::vector<DrawnStretch> labelled_;
     ScaleBar scaleBar_;
     std::optional<Pin> pin_;
 };

@@ -65,6 +65,7 @@ double westOfAll(std::vector<Extent> extents) {
 
 void layBesideEachOther(std::vector<PinnedLine>& lines) {
     std::vector<Extent> extents;
+    extents.reserve(lines.size());
     for (PinnedLine& line : lines)
         extents.push_back(joinSteps(line));
     const double first = westOfAll(extents);

@@ -192,12 +192,27 @@ private:
         add(Verb::Sibling, {dice_.one(codes), dice_.between(0, 5000), dice_.between(-1, 8)},
             {anyRiver(dice_)});
     }
-    // The shell does something of what else could come now.
+    // What a shell does sooner than a user.
+    void disturb() {
+        switch (dice_.below(6)) {
+        case 0:
+            return add(Verb::Close);
+        case 1:
+            return changeTab();
+        case 2:
+            return run(dice_.onceIn(2) ? "undo" : "delete-line");
+        case 3:
+            return add(Verb::Save);
+        default:
+            return useWindows();
+        }
+    }
+    // The shell does something in the middle of what comes next.
     void armShell() {
         constexpr std::array moments = {"24", "25", "52", "200", "503", "523", "show", "hide", "box"};
         const std::size_t before = script_.size();
         while (script_.size() == before)
-            addPhrase();
+            dice_.onceIn(2) ? disturb() : addPhrase();
         const Action first = script_[before];
         if (first.verb == Verb::When)
             return;

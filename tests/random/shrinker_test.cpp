@@ -27,7 +27,7 @@ bool forgetsALine(const Script& script) {
 TEST(TheShrinker, LeavesWhatShowsTheFaultAndNothingElse) {
     const Script shortest = parseScript("type \"7\"\nline 3\nline 3\nline 3\n");
     int faults = 0;
-    for (std::uint64_t seed = 0; seed < 300; ++seed) {
+    for (std::uint64_t seed = 0; seed < 1000; ++seed) {
         const Script script = makeScript(seed, 150, surroundings);
         if (!forgetsALine(script))
             continue;
