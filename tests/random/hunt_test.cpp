@@ -21,6 +21,10 @@ using Look = std::function<void(Stage& stage)>;
 
 class AHunt : public testing::Test {
 protected:
+    // What a process leaves that crashes goes with the test.
+    AHunt() { setenv("TMPDIR", folder.path().c_str(), 1); }
+    ~AHunt() override { unsetenv("TMPDIR"); }
+
     Game gameWith(Look look) {
         return {.make = [this](std::uint64_t n) { return makeScript(seedOf(3, n), 40, surroundings); },
                 .play = [this, look = std::move(look)](const Script& script,
@@ -28,6 +32,7 @@ protected:
     }
     HuntResult result(const Game& game, std::uint64_t count = 60) { return hunt(game, count, log); }
 
+    const kota::test::TempFolder folder;
     const Surroundings surroundings = lookAround();
     std::ostringstream log;
 
