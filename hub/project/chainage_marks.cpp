@@ -2,8 +2,6 @@
 
 #include "hub/project/round_step.h"
 
-#include <QFontMetricsF>
-
 #include <cmath>
 
 namespace kota::hub {
@@ -87,7 +85,7 @@ void paintMarks(QPainter& painter, const MapScene& scene, const MapColours& colo
         const QString text = scene.chainages.text(chainage);
         const QSizeF size(metrics.horizontalAdvance(text) + 2, metrics.height());
         if (const std::optional<QRectF> rect = placeBeside(stretch, along, size, places)) {
-            painter.drawText(*rect, Qt::AlignCenter | Qt::TextDontClip, text);
+            writeLabel(painter, metrics, *rect, text);
             places.take(*rect);
         }
     }

@@ -2,6 +2,8 @@
 
 #include "hub/project/projection.h"
 
+#include <QRegularExpression>
+
 #include <algorithm>
 #include <array>
 #include <utility>
@@ -33,12 +35,20 @@ double chainageWithin(const PinnedLine& line, const JsonPlace& place) {
     return chainage;
 }
 
-// The names of the systems of longitudes and latitudes that networks come in; all others are metres.
+// Whether the name is that of a usual system of longitudes and latitudes.
 bool namesDegrees(const QString& system) {
-    constexpr std::array endings = {"CRS84", "CRS83", "CRS27", ":4326", ":4269", ":4267", ":4258"};
+    constexpr std::array endings = {"CRS84", "CRS83", "CRS27", ":4326", ":4269", ":4267", ":4258",
+                                    ":4283", ":4490", ":4612", ":6318", ":6668", ":7844"};
     return std::ranges::any_of(endings, [&system](const char* ending) {
         return system.endsWith(QLatin1String(ending), Qt::CaseInsensitive);
     });
+}
+
+// Whether the name is an EPSG number of five digits, all of which are of systems in metres or the like, or
+// that of the web's maps.
+bool namesMetres(const QString& system) {
+    static const QRegularExpression numbers(":([1-9][0-9]{4}|3857)$");
+    return numbers.match(system).hasMatch();
 }
 
 bool couldBeDegrees(QPointF point) {
@@ -68,7 +78,11 @@ void GeoJsonFeatures::readCoordinateSystem() {
     if (!system.isThere() || system.isNull())
         return;
     const JsonPlace properties = system["properties"];
-    coordinates_ = namesDegrees(properties["name"].text()) ? Coordinates::Degrees : Coordinates::Metres;
+    const QString name = properties["name"].text();
+    if (namesDegrees(name))
+        coordinates_ = Coordinates::Degrees;
+    else if (namesMetres(name))
+        coordinates_ = Coordinates::Metres;
 }
 
 void GeoJsonFeatures::readAll() {

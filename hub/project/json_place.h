@@ -42,7 +42,6 @@ public:
 
     bool isThere() const { return !value_.isUndefined(); }
     bool isNull() const { return value_.isNull(); }
-    bool isText() const { return value_.isString(); }
     // With other characters than spaces.
     QString text() const;
     // Finite.

@@ -1,6 +1,5 @@
 #include "hub/project/map_labels.h"
 
-#include <QFontMetricsF>
 #include <QSet>
 
 #include <algorithm>
@@ -13,6 +12,8 @@ namespace {
 constexpr double leastNamed = 24;             // pixels of a river in view
 constexpr std::size_t mostNamed = 250;        // names are tried
 constexpr std::array distances = {7.0, 13.0}; // pixels from a line
+
+constexpr double roomBehindName = 18; // pixels, where there are other places
 
 // Where on its river a name is tried, in this order.
 constexpr std::array shares = {0.5, 0.38, 0.62, 0.26, 0.74, 0.14, 0.86};
@@ -31,10 +32,10 @@ std::vector<const DrawnStretch*> longestFirst(const std::vector<DrawnStretch>& s
 }
 
 std::optional<QRectF> placeOf(QSizeF name, const DrawnStretch& stretch, const LabelPlaces& places,
-                              LabelPlaces::On on) {
+                              LabelNeeds needs) {
     for (const double share : shares)
         if (const std::optional<QRectF> rect =
-                placeBeside(stretch, share * stretch.length(), name, places, on))
+                placeBeside(stretch, share * stretch.length(), name, places, needs))
             return rect;
     return std::nullopt;
 }
@@ -48,28 +49,34 @@ QRectF besideOf(QPointF place, QPointF towards, double distance, QSizeF size) {
     return rect;
 }
 
-void paintEdge(QPainter& painter, const QRectF& rect, const QString& text, const QColor& ground) {
+void paintEdge(QPainter& painter, const QFontMetricsF& metrics, const QRectF& rect, const QString& text,
+               const QColor& ground) {
     const QPen pen = painter.pen();
     painter.setPen(ground);
     for (const QPointF shift : {QPointF(-1, -1), QPointF(1, -1), QPointF(-1, 1), QPointF(1, 1)})
-        painter.drawText(rect.translated(shift), Qt::AlignCenter | Qt::TextDontClip, text);
+        writeLabel(painter, metrics, rect.translated(shift), text);
     painter.setPen(pen);
 }
 
 } // namespace
 
 std::optional<QRectF> placeBeside(const DrawnStretch& stretch, double along, QSizeF text,
-                                  const LabelPlaces& places, LabelPlaces::On on) {
+                                  const LabelPlaces& places, LabelNeeds needs) {
     const QPointF place = stretch.pointAt(along);
     const QPointF direction = stretch.directionAt(along);
     const QPointF right(-direction.y(), direction.x());
-    for (const double distance : distances)
-        for (const QPointF side : {QPointF(1, 0), QPointF(-1, 0), right, -right}) {
-            const QRectF rect = besideOf(place, side, distance, text);
-            if (places.isFree(rect, on))
-                return rect;
-        }
+    for (const QPointF side : {QPointF(1, 0), right})
+        for (const double distance : distances)
+            for (const QPointF towards : {side, -side}) {
+                const QRectF rect = besideOf(place, towards, distance, text);
+                if (places.isFree(rect.united(rect.translated(towards * needs.behind)), needs.on))
+                    return rect;
+            }
     return std::nullopt;
+}
+
+void writeLabel(QPainter& painter, const QFontMetricsF& metrics, const QRectF& rect, const QString& text) {
+    painter.drawText(rect.topLeft() + QPointF(1, metrics.ascent()), text);
 }
 
 void paintRiverNames(QPainter& painter, const Network& network, const std::vector<DrawnStretch>& stretches,
@@ -81,15 +88,17 @@ void paintRiverNames(QPainter& painter, const Network& network, const std::vecto
         if (named.contains(name))
             continue;
         const QSizeF size(metrics.horizontalAdvance(name) + 2, metrics.height());
-        std::optional<QRectF> rect = placeOf(size, *stretch, places, LabelPlaces::On::Nothing);
+        std::optional<QRectF> rect = placeOf(size, *stretch, places, {.behind = roomBehindName});
+        if (!rect)
+            rect = placeOf(size, *stretch, places, {});
         if (!rect && stretch->length() > size.width()) {
-            rect = placeOf(size, *stretch, places, LabelPlaces::On::LinesAtMost);
+            rect = placeOf(size, *stretch, places, {.on = LabelPlaces::On::LinesAtMost});
             if (rect)
-                paintEdge(painter, *rect, name, ground);
+                paintEdge(painter, metrics, *rect, name, ground);
         }
         if (!rect)
             continue;
-        painter.drawText(*rect, Qt::AlignCenter | Qt::TextDontClip, name);
+        writeLabel(painter, metrics, *rect, name);
         places.take(*rect);
         named.insert(name);
     }

@@ -1,5 +1,7 @@
 #include "hub/project/network.h"
 
+#include <algorithm>
+#include <cmath>
 #include <utility>
 
 namespace kota::hub {
@@ -21,10 +23,14 @@ std::size_t vertexBehind(const River& river, double chainage) {
     return static_cast<std::size_t>(found - river.chainages.begin());
 }
 
-std::optional<QPointF> placeOn(const River& river, double chainage) {
+// The ends are taken for reached within a millimetre: a chainage that was shown and read again is not the
+// same to the last digit.
+std::optional<QPointF> placeOn(const River& river, double wanted) {
+    constexpr double tolerance = 1e-3;
     const auto [lowest, highest] = std::minmax({river.firstChainage(), river.lastChainage()});
-    if (!(chainage >= lowest && chainage <= highest))
+    if (!(wanted >= lowest - tolerance && wanted <= highest + tolerance))
         return std::nullopt;
+    const double chainage = std::clamp(wanted, lowest, highest);
     const std::size_t behind = vertexBehind(river, chainage);
     const double from = river.chainages[behind - 1];
     const double span = river.chainages[behind] - from;
@@ -45,7 +51,7 @@ Network::Network(std::vector<River> rivers) : rivers_(std::move(rivers)) {
     indices_.reserve(rivers_.size());
     for (const River& river : rivers_) {
         bounds_.add(indices_.emplace_back(river.vertices).bounds());
-        std::vector<std::size_t>& reaches = reaches_[river.name];
+        std::vector<std::size_t>& reaches = reaches_[river.name.toUpper()];
         if (reaches.empty())
             names_.append(river.name);
         reaches.push_back(indices_.size() - 1);
@@ -53,7 +59,7 @@ Network::Network(std::vector<River> rivers) : rivers_(std::move(rivers)) {
 }
 
 std::optional<QPointF> Network::place(const QString& river, double chainage) const {
-    const auto reaches = reaches_.constFind(river);
+    const auto reaches = reaches_.constFind(river.toUpper());
     if (reaches == reaches_.constEnd())
         return std::nullopt;
     for (const std::size_t reach : *reaches)

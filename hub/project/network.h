@@ -43,7 +43,8 @@ public:
     // The box around all rivers; empty where there are none.
     const Box& bounds() const { return bounds_; }
 
-    // Each name once, in the order of their first reaches.
+    // Each name once, in the order of their first reaches. The case of letters does not tell rivers apart,
+    // since editors write names in capitals.
     const QStringList& names() const { return names_; }
 
     // The place at a chainage, interpolated between the vertices around it; the first one where several
@@ -59,7 +60,7 @@ private:
     std::vector<LineIndex> indices_; // one for each river
     Box bounds_;
     QStringList names_;
-    QHash<QString, std::vector<std::size_t>> reaches_; // by name
+    QHash<QString, std::vector<std::size_t>> reaches_; // by name, in capitals
 };
 
 } // namespace kota::hub

@@ -13,7 +13,7 @@ constexpr UINT id(ProjectText text) {
 constexpr kota::StringResource japanese[] = {
     {id(ProjectText::FileNotReadable), "%1: ファイルを読み込めません: %2"},
     {id(ProjectText::NotJson), "%1:%2:%3: 正しい JSON が必要です (%4)"},
-    {id(ProjectText::Misfit), "%1: %2が必要ですが、%3があります"},
+    {id(ProjectText::Misfit), "%1: %2が必要ですが、実際は%3です"},
     {id(ProjectText::Within), "%1: %2"},
     {id(ProjectText::Feature), "地物 %1"},
     {id(ProjectText::NamedFeature), "地物 %1 (%2)"},
@@ -31,7 +31,7 @@ constexpr kota::StringResource japanese[] = {
     {id(ProjectText::ALatitude), " -90 から 90 までの緯度"},
     {id(ProjectText::AChainageInSpan), " chainage_start から chainage_end までの追加距離"},
     {id(ProjectText::AChainageInOrder), "線に沿った地点の順の追加距離"},
-    {id(ProjectText::Nothing), "何もない状態"},
+    {id(ProjectText::Nothing), "値なし"},
     {id(ProjectText::SomeObject), "オブジェクト"},
     {id(ProjectText::SomeList), "リスト"},
     {id(ProjectText::AnEmptyList), "空のリスト"},

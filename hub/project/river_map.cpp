@@ -149,6 +149,11 @@ void RiverMap::pickAt(QPointF screen) {
         setPicked(found);
 }
 
+void RiverMap::dropPick() {
+    if (picked_)
+        setPicked(std::nullopt);
+}
+
 // The receiver may show another network or pick anew.
 void RiverMap::setPicked(std::optional<Location> location) {
     picked_ = std::move(location);

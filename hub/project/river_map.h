@@ -28,6 +28,8 @@ public:
     void clearCurrentLocation();
 
     const std::optional<Location>& picked() const { return picked_; }
+    // Takes the pick back, as Escape does.
+    void dropPick();
     // The user picked a location, or took the pick back.
     std::function<void(const std::optional<Location>&)> onPick;
 

@@ -1,14 +1,23 @@
 #include "hub/screen/dock.h"
 
-#include "hub/screen/keyboard.h"
-
+#include <QKeyEvent>
 #include <QVariant>
+
+#include <algorithm>
+#include <array>
 
 namespace kota::hub {
 
 namespace {
 
 constexpr const char* commandProperty = "command";
+
+// Whether the key is one of the program's that change no document.
+bool isForProgram(const QKeyEvent& key) {
+    constexpr std::array letters = {Qt::Key_N, Qt::Key_O, Qt::Key_S, Qt::Key_Q};
+    const bool isHeld = key.modifiers() == Qt::ControlModifier;
+    return key.key() == Qt::Key_F6 || (isHeld && std::ranges::find(letters, key.key()) != letters.end());
+}
 
 bool leads(const QKeyEvent& key) {
     const bool controlTab = key.key() == Qt::Key_Tab && key.modifiers().testFlag(Qt::ControlModifier);
@@ -19,6 +28,8 @@ bool leads(const QKeyEvent& key) {
 
 Dock::Dock(UINT command, const QString& title) : QDockWidget(title) {
     setProperty(commandProperty, command);
+    setFeatures(DockWidgetClosable |
+                DockWidgetMovable); // a window of its own would get no keys of the program
 }
 
 UINT Dock::commandOf(const QDockWidget& panel) {
@@ -31,7 +42,7 @@ void Dock::fill(QWidget& content, QWidget& first) {
 }
 
 void Dock::keyPressEvent(QKeyEvent* event) {
-    event->setAccepted(!isForShell(*event));
+    event->setAccepted(!isForProgram(*event));
     if (leads(*event) && onLeave)
         onLeave();
 }

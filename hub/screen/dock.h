@@ -9,7 +9,8 @@
 namespace kota::hub {
 
 // A panel of the shell beside the documents, which the main window's menu shows and hides by a command. Keys
-// that its widgets leave go no further, but for those of the menu; Escape and Ctrl+Tab leave the panel.
+// that its widgets leave go no further, so that nothing happens in a document behind the user's back, but for
+// Ctrl+N, O, S and Q and F6; Escape and Ctrl+Tab leave the panel.
 class Dock : public QDockWidget {
 public:
     Dock(UINT command, const QString& title);

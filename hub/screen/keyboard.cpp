@@ -44,11 +44,12 @@ std::optional<WPARAM> heldLetter(const QKeyEvent& key) {
                               : std::nullopt;
 }
 
-} // namespace
-
+// Whether the key means a command at most, and no text of a window.
 bool isForShell(const QKeyEvent& key) {
     return heldLetter(key) || (key.key() >= Qt::Key_F1 && key.key() <= Qt::Key_F12);
 }
+
+} // namespace
 
 std::optional<WPARAM> virtualKey(int qtKey) {
     if (qtKey >= Qt::Key_F1 && qtKey <= Qt::Key_F12)

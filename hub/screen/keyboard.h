@@ -42,8 +42,6 @@ std::optional<WPARAM> virtualKey(int qtKey);
 input::Modifiers modifiersOf(const QKeyEvent& key);
 // The text that a key types; empty for a key that types none.
 QString typedText(const QKeyEvent& key);
-// Whether the key means a command at most, and no text of a window.
-bool isForShell(const QKeyEvent& key);
 // Whether a line of text that is being edited uses the key itself.
 bool isForLineOfText(const QKeyEvent& key);
 

@@ -129,6 +129,11 @@ QStringList QtScreen::askOpenNames(const QString& filters) {
     return QFileDialog::getOpenFileNames(QApplication::activeWindow(), QString(), QString(), filters);
 }
 
+QString QtScreen::askOpenName(const QString& filters) {
+    const Answering scope(queue_);
+    return QFileDialog::getOpenFileName(QApplication::activeWindow(), QString(), QString(), filters);
+}
+
 std::optional<int> QtScreen::askChoice(const QString& title, const QString& question,
                                        const QStringList& entries) {
     const Answering scope(queue_);

@@ -32,6 +32,8 @@ public:
 
     // Asks for files to open; `filters` is in the toolkit's form. Empty when the user changed their mind.
     QStringList askOpenNames(const QString& filters);
+    // The same for one file.
+    QString askOpenName(const QString& filters);
     // Asks for one of several things; its place among them, none when the user changed their mind.
     std::optional<int> askChoice(const QString& title, const QString& question, const QStringList& entries);
     // Shows a dialog of the shell's own; whether the user accepted it.

@@ -5,11 +5,16 @@
 #include <QByteArray>
 #include <QString>
 
+#include <string_view>
+
 namespace kota::hub {
 
 // The platform's texts are UTF-8; bytes that are not show as replacement characters.
+inline QString toQt(std::string_view text) {
+    return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
+}
 inline QString toQt(const CString& text) {
-    return QString::fromUtf8(text.View().data(), static_cast<qsizetype>(text.View().size()));
+    return toQt(text.View());
 }
 
 inline QByteArray toPlatform(const QString& text) {

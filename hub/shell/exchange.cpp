@@ -1,6 +1,8 @@
 #include "hub/shell/exchange.h"
 
 #include "hub/screen/text.h"
+#include "platform/framework/document.h"
+#include "platform/framework/view.h"
 
 #include <memory>
 
@@ -36,9 +38,10 @@ bool Exchange::isMessage(UINT message) {
 
 LRESULT Exchange::take(UINT message, WPARAM code, const CKHComm_Package* package) {
     PassedMessage passed{message, code, package ? toQt(package->documentName) : QString(), {}, {}};
+    static const CKHComm_Package empty;
     LRESULT result = 0;
     if (message == switchBoardMessage())
-        result = answer(code, package, passed);
+        result = answer(code, package ? *package : empty, passed);
     else if (message == communicationMessage() && code == CommunicationCode::LocationChanged)
         takeLocation(package, passed);
     if (onMessage)
@@ -46,26 +49,48 @@ LRESULT Exchange::take(UINT message, WPARAM code, const CKHComm_Package* package
     return result;
 }
 
-LRESULT Exchange::answer(WPARAM code, const CKHComm_Package* package, PassedMessage& passed) {
-    const Projects::Handle handle = package ? package->project : 0;
+Projects::Handle Exchange::join(const CView* window) {
+    const CDocument* const document = window ? window->GetDocument() : nullptr;
+    if (!document)
+        return projects_.join();
+    const bool isFirst = document->Views().size() <= 1;
+    if (isFirst)
+        members_[document] = {projects_.join(), 0};
+    const auto member = members_.find(document);
+    if (member == members_.end() || member->second.project == 0) {
+        members_.erase(document);
+        return 0;
+    }
+    ++member->second.windows;
+    return member->second.project;
+}
+
+void Exchange::leave(const CView* window, Projects::Handle project) {
+    const auto member = members_.find(window ? window->GetDocument() : nullptr);
+    if (member != members_.end() && --member->second.windows > 0)
+        return;
+    if (member != members_.end())
+        members_.erase(member);
+    projects_.leave(project);
+}
+
+LRESULT Exchange::answer(WPARAM code, const CKHComm_Package& package, PassedMessage& passed) {
     switch (code) {
     case SwitchBoardCode::JoinProject:
-        return projects_.join();
+        return join(package.sender);
     case SwitchBoardCode::LeaveProject:
-        projects_.leave(handle);
+        leave(package.sender, package.project);
         return 0;
     case SwitchBoardCode::OfferRivers: {
-        const auto network = projects_.network(handle);
+        const auto network = projects_.network(package.project);
         return network ? handOver(riversOf(*network)) : 0;
     }
-    case SwitchBoardCode::OfferLocation: {
-        if (!offered_)
+    case SwitchBoardCode::OfferLocation:
+        // A place of the open project is nowhere in another one.
+        if (!offered_ || (package.project != 0 && package.project != projects_.current()))
             return 0;
         passed.place = offered_;
-        auto item = itemAt(*offered_);
-        passed.dataType = item->dataType;
-        return handOver(std::move(item));
-    }
+        return handOver(itemAt(*offered_));
     default:
         return 0;
     }
@@ -73,11 +98,14 @@ LRESULT Exchange::answer(WPARAM code, const CKHComm_Package* package, PassedMess
 
 void Exchange::takeLocation(const CKHComm_Package* package, PassedMessage& passed) {
     const auto* const item = package ? dynamic_cast<const CK31_CBE_ModelDataItem*>(package->items) : nullptr;
+    if (!package && IsWindow(teller_)) // another window went
+        return;
     std::optional<Place> told;
     if (item) {
         told = Place{toQt(item->riverName), item->chainage};
         passed.dataType = item->dataType;
     }
+    teller_ = item && package->sender ? package->sender->GetSafeHwnd() : nullptr;
     passed.place = told;
     if (told == current_)
         return;

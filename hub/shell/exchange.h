@@ -4,7 +4,10 @@
 #include "hub/shell/projects.h"
 
 #include <functional>
+#include <map>
 #include <optional>
+
+class CDocument;
 
 namespace kota::hub {
 
@@ -40,7 +43,7 @@ public:
     // The place that is offered to an editor which asks for one.
     void offer(std::optional<Place> place) { offered_ = std::move(place); }
     const std::optional<Place>& offered() const { return offered_; }
-    // Where the user is in the editor in front; none when no editor has told, or it has gone.
+    // The last place that an editor told; none when none has, or the window that told has gone.
     const std::optional<Place>& current() const { return current_; }
 
     // Called behind each message, and when the current place has become another.
@@ -48,10 +51,19 @@ public:
     std::function<void()> onCurrentPlace;
 
 private:
-    LRESULT answer(WPARAM code, const CKHComm_Package* package, PassedMessage& passed);
+    // A document of which several windows ask belongs to one project, whichever is open meanwhile.
+    struct Membership {
+        Projects::Handle project = 0;
+        int windows = 0;
+    };
+    Projects::Handle join(const CView* window);
+    void leave(const CView* window, Projects::Handle project);
+    LRESULT answer(WPARAM code, const CKHComm_Package& package, PassedMessage& passed);
     void takeLocation(const CKHComm_Package* package, PassedMessage& passed);
 
     Projects& projects_;
+    std::map<const CDocument*, Membership> members_; // of documents that belong to a project
+    HWND teller_ = nullptr;                          // the window that told the current place
     std::optional<Place> offered_;
     std::optional<Place> current_;
 };

@@ -18,10 +18,18 @@ namespace kota::hub {
 
 namespace {
 
-// As long as the texts that are usual in the columns.
-constexpr std::array samples = {"00:00:00.000",  "00000",    "Asks which rivers there are",
-                                "document.AD31", "MISSOURI", "000000.000",
-                                "0 Non Cohesive"};
+// As long as the texts that are usual in the columns; the meanings are measured.
+constexpr std::array samples = {"00:00:00.000", "00000",         "", "document.AD31", "LITTLE MISSOURI",
+                                "000000.000",   "0 Non Cohesive"};
+
+int widestMeaning(const QFontMetrics& metrics) {
+    int width = 0;
+    for (const HubText meaning :
+         {HubText::LeavesProject, HubText::JoinsProject, HubText::AsksForRivers, HubText::AsksForLocation,
+          HubText::LocationChanged, HubText::DataChanged, HubText::ShowsToolBar, HubText::HidesToolBar})
+        width = std::max(width, metrics.horizontalAdvance(hubText(meaning)));
+    return width;
+}
 
 } // namespace
 
@@ -37,9 +45,12 @@ ExchangeDock::ExchangeDock() : Dock(HubCommand::ShowExchange, hubText(HubText::E
     view_.verticalHeader()->hide();
     view_.verticalHeader()->setDefaultSectionSize(view_.fontMetrics().height() + 4);
     view_.horizontalHeader()->setStretchLastSection(true);
+    constexpr int margins = 24;
+    const QFontMetrics metrics = view_.fontMetrics();
     for (int column = 0; column < ExchangeModel::ColumnCount; ++column)
-        view_.setColumnWidth(
-            column, view_.fontMetrics().horizontalAdvance(samples[static_cast<std::size_t>(column)]) + 24);
+        view_.setColumnWidth(column,
+                             metrics.horizontalAdvance(samples[static_cast<std::size_t>(column)]) + margins);
+    view_.setColumnWidth(ExchangeModel::Meaning, widestMeaning(metrics) + margins);
     view_.setAccessibleName(hubText(HubText::Exchange));
     view_.installEventFilter(this);
 

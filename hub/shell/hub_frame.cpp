@@ -126,14 +126,23 @@ void HubFrame::openFiles(const QStringList& paths) {
     }
 }
 
+void HubFrame::resume(const Workspace& workspace, const QStringList& asked) {
+    if (!workspace.project.isEmpty() && std::ranges::none_of(asked, isNetwork))
+        OpenProject(workspace.project);
+    openFiles(asked.isEmpty() ? workspace.documents : asked);
+}
+
 QStringList HubFrame::documents() const {
     QStringList paths;
-    for (const CMDIChildWnd* child : Children()) {
-        const CDocument* const document = child->GetActiveDocument();
+    const auto add = [&](const CDocument* document) {
         const QString path = document ? QFile::decodeName(QByteArray(document->GetPathName())) : QString();
-        if (!path.isEmpty() && !paths.contains(path))
+        paths.removeAll(path);
+        if (!path.isEmpty())
             paths.append(path);
-    }
+    };
+    for (const CMDIChildWnd* child : Children())
+        add(child->GetActiveDocument());
+    add(FrontDocument());
     return paths;
 }
 
@@ -158,7 +167,7 @@ void HubFrame::ProjectChanged() {
 
 void HubFrame::OnProjectOpen() {
     const QString filter = hubText(HubText::RiverNetworks) + " (*.geojson *.json)";
-    for (const QString& path : screen_.askOpenNames(filter).mid(0, 1))
+    if (const QString path = screen_.askOpenName(filter); !path.isEmpty())
         OpenProject(path);
 }
 
@@ -228,10 +237,10 @@ void HubFrame::OnExit() {
     OnClose();
 }
 
-void HubFrame::OnClose() {
-    if (onEnd)
+BOOL HubFrame::DestroyWindow() {
+    if (GetSafeHwnd() && onEnd)
         onEnd();
-    CKhMDIFrameWnd::OnClose();
+    return CKhMDIFrameWnd::DestroyWindow();
 }
 
 void HubFrame::OnAbout() {
@@ -313,7 +322,7 @@ void HubFrame::ListRecentFiles() {
                            toPlatform(QString("&%1 %2 - %3").arg(i + 1).arg(name, folder)).constData()});
     }
     if (paths.isEmpty())
-        entries.push_back({ID_FILE_MRU_FILE1, "Recent File"});
+        entries.push_back({ID_FILE_MRU_FILE1, toPlatform(hubText(HubText::RecentFile)).constData()});
     GetMenu()->ReplaceCommands(ID_FILE_MRU_FILE1, ID_FILE_MRU_FILE1 + RecentFiles::most, entries);
     DrawMenuBar();
 }

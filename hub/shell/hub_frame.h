@@ -4,6 +4,7 @@
 #include "hub/shell/exchange.h"
 #include "hub/shell/plug_ins.h"
 #include "hub/shell/recent_files.h"
+#include "hub/shell/workspace.h"
 #include "platform/foundation/frames.h"
 #include "platform/framework/application.h"
 
@@ -27,7 +28,10 @@ public:
     // Documents, and river networks, which are projects. Each with a box that says why, where one cannot be
     // opened.
     void openFiles(const QStringList& paths);
-    // The documents that are open and have a file, in the order in which they were opened.
+    // Goes on where the user stopped: opens what is asked for, or else the documents that were open, and the
+    // project that was, unless another one is asked for.
+    void resume(const Workspace& workspace, const QStringList& asked);
+    // The documents that are open and have a file, the one in front last.
     QStringList documents() const;
 
     const Projects& projects() const { return projects_; }
@@ -35,11 +39,11 @@ public:
 
     // A project was opened or closed.
     std::function<void()> onProject;
-    // The user ends the program: everything is still open, and may be, if the user changes their mind.
+    // The program ends: all questions are answered, and everything is still open.
     std::function<void()> onEnd;
 
     BOOL OnCmdMsg(UINT id, int notification) override;
-    void OnClose() override;
+    BOOL DestroyWindow() override;
     void OnDropFiles(const std::vector<CString>& paths) override;
     LRESULT WindowProc(UINT message, WPARAM wParam, LPARAM lParam) override;
 

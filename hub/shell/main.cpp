@@ -79,18 +79,10 @@ void speak(int language, const QtScreen& screen, QTranslator& toolkitTexts) {
 // As the user left it, or of the usual size.
 void placeWindow(QMainWindow& window, const Workspace& workspace, bool forPictures) {
     window.setMinimumSize(leastSize);
-    if (!forPictures && workspace.restore(window))
+    if (!forPictures && workspace.restoreGeometry(window))
         return;
     const QSize room = forPictures ? firstSize : window.screen()->availableSize();
     window.resize(firstSize.boundedTo(room)); // pictures are of one size, whatever the display
-}
-
-// The last project, and what was asked for, or else the documents that were open.
-QStringList filesToOpen(const Workspace& workspace, const QStringList& asked) {
-    QStringList files = asked.isEmpty() ? workspace.documents : asked;
-    if (!workspace.project.isEmpty())
-        files.prepend(workspace.project);
-    return files;
 }
 
 int runHub(const Start& start) {
@@ -114,8 +106,12 @@ int runHub(const Start& start) {
         };
         screen.perform([&] { frame.load(kota::hub::loadPlugIns(kota::hub::plugInFolder())); });
         if (start.tourFolder.isEmpty()) {
-            const QStringList files = filesToOpen(workspace, start.files);
-            AfterFirstPaint opening(*window, [&] { screen.perform([&] { frame.openFiles(files); }); });
+            AfterFirstPaint opening(*window, [&] {
+                screen.perform([&] {
+                    frame.resume(workspace, start.files);
+                    workspace.restoreLayout(*window); // which says, too, whether the map is to be seen
+                });
+            });
             result = QApplication::exec();
         } else {
             result = kota::hub::takeTour(frame, *window, start.files.value(0), start.tourFolder);

@@ -2,7 +2,19 @@
 
 #include "hub/shell/settings.h"
 
+#include <cmath>
+
 namespace kota::hub {
+
+namespace {
+
+// A mouse is no finer than whole units, which is what the user reads at the pin.
+double asShown(double chainage) {
+    const double unit = metresPerChainageUnit();
+    return std::round(chainage / unit) * unit;
+}
+
+} // namespace
 
 Panels::Panels(QMainWindow& window, HubFrame& frame, QtScreen& screen)
     : frame_(frame), map_(new MapDock), exchange_(new ExchangeDock) {
@@ -18,9 +30,14 @@ Panels::Panels(QMainWindow& window, HubFrame& frame, QtScreen& screen)
             screen.perform([] {});
         };
 
+    // A place that is not to be seen is not offered.
+    QObject::connect(map_, &QDockWidget::visibilityChanged, map_, [map = map_] {
+        if (map->isHidden())
+            map->map().dropPick();
+    });
     Exchange& passed = frame_.exchange();
     map_->map().onPick = [&passed](const std::optional<Location>& picked) {
-        passed.offer(picked ? std::optional(Place{picked->river, picked->chainage}) : std::nullopt);
+        passed.offer(picked ? std::optional(Place{picked->river, asShown(picked->chainage)}) : std::nullopt);
     };
     passed.onMessage = [this](const PassedMessage& message) { exchange_->add(message); };
     passed.onCurrentPlace = [this] { map_->showPlace(frame_.exchange().current()); };

@@ -20,6 +20,7 @@ public:
     void open(const QString& path, std::shared_ptr<const Network> network);
     void close();
     bool isOpen() const { return current_ != 0; }
+    Handle current() const { return current_; } // 0 when none is open
     // The network's file; empty when none is open.
     QString path() const;
     // Null when none is open.
@@ -27,7 +28,7 @@ public:
     // Null for a handle that no project has.
     std::shared_ptr<const Network> network(Handle handle) const;
 
-    // An editor's window joins the open project: its handle, 0 when none is open.
+    // A document joins the open project: its handle, 0 when none is open.
     Handle join();
     void leave(Handle handle);
 

@@ -1,5 +1,6 @@
 #include "hub/shell/settings.h"
 
+#include "hub/screen/text.h"
 #include "platform/foundation/units.h"
 
 #include <QSettings>
@@ -11,10 +12,6 @@ namespace {
 constexpr const char* languageKey = "language";
 constexpr const char* unitsGroup = "units";
 constexpr int chainageItem = 100143;
-
-QString symbolOf(const Unit& unit) {
-    return QString::fromUtf8(unit.symbol.data(), static_cast<qsizetype>(unit.symbol.size()));
-}
 
 const Unit& chainageUnit() {
     return findUnitItem(chainageItem)->units[static_cast<std::size_t>(displayUnit(chainageItem))];
@@ -45,14 +42,14 @@ void Settings::applyUnits() const {
     for (const auto& [id, symbol] : units) {
         const UnitItem* const item = findUnitItem(id);
         for (std::size_t unit = 0; item && unit < item->units.size(); ++unit)
-            if (symbolOf(item->units[unit]) == symbol)
+            if (toQt(item->units[unit].symbol) == symbol)
                 setDisplayUnit(id, static_cast<int>(unit));
     }
 }
 
 QString chainageText(double metres) {
     const Unit& unit = chainageUnit();
-    return QString::number(toDisplay(unit, metres), 'f', 0) + ' ' + symbolOf(unit);
+    return QString::number(toDisplay(unit, metres), 'f', 0) + ' ' + toQt(unit.symbol);
 }
 
 double metresPerChainageUnit() {

@@ -1,5 +1,6 @@
 #include "hub/shell/settings_dialog.h"
 
+#include "hub/screen/text.h"
 #include "hub/shell/menu.h"
 #include "platform/foundation/units.h"
 
@@ -25,7 +26,7 @@ constexpr std::array<std::pair<int, HubText>, 4> items = {{{100143, HubText::Uni
 QComboBox* unitChoice(int item, const QString& chosen) {
     auto* const choice = new QComboBox;
     for (const Unit& unit : findUnitItem(item)->units)
-        choice->addItem(QString::fromUtf8(unit.symbol.data(), static_cast<qsizetype>(unit.symbol.size())));
+        choice->addItem(toQt(unit.symbol));
     choice->setCurrentText(chosen);
     return choice;
 }

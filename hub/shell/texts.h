@@ -14,6 +14,7 @@ enum class HubText : UINT {
     NoEditors,
     NotLoaded,  // file, reason
     NoEditorIn, // folder
+    RecentFile, // in place of files
 
     RiverMap,
     Exchange,

@@ -51,6 +51,7 @@ constexpr StringResource strings[] = {
     {id(HubText::NoEditors), "none"},
     {id(HubText::NotLoaded), "%1 could not be loaded: %2"},
     {id(HubText::NoEditorIn), "There is no editor in %1."},
+    {id(HubText::RecentFile), "Recent File"},
     {id(HubText::RiverMap), "River Map"},
     {id(HubText::Exchange), "Exchange"},
     {id(HubText::RiverNetworks), "River networks"},

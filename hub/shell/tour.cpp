@@ -10,6 +10,7 @@
 #include <QMessageBox>
 #include <QTextStream>
 
+#include <cmath>
 #include <stdexcept>
 
 namespace kota::hub {
@@ -21,8 +22,8 @@ constexpr int components = 0;
 constexpr int dispersion = 1;
 constexpr int decay = 4;
 constexpr int minimumCoefficient = 3;
-// On the first river of the example, in metres: Omaha.
-constexpr double placeOnMap = 187328;
+// Down the first river of the network; in the example, near Omaha.
+constexpr double wayToPick = 0.827;
 
 class Tour {
 public:
@@ -130,11 +131,11 @@ private:
     void insertPickedPlace() {
         if (!frame_.projects().isOpen())
             return;
-        const QString river = frame_.projects().network()->names().first();
+        const River& river = frame_.projects().network()->rivers().front();
         robot_.clickTab(dispersion);
         robot_.clickCell(robot_.lineCount(), 3);
         step("The map shows where the user is");
-        robot_.clickMap(river, placeOnMap);
+        robot_.clickMap(river.name, std::lerp(river.firstChainage(), river.lastChainage(), wayToPick));
         step("A place is picked on the map");
         robot_.clickTab(decay);
         robot_.clickCell(1, 2);

@@ -38,11 +38,13 @@ void Workspace::take(const QMainWindow& window) {
     layout = window.saveState();
 }
 
-bool Workspace::restore(QMainWindow& window) const {
-    if (geometry.isEmpty() || !window.restoreGeometry(geometry))
-        return false;
-    window.restoreState(layout);
-    return true;
+bool Workspace::restoreGeometry(QMainWindow& window) const {
+    return !geometry.isEmpty() && window.restoreGeometry(geometry);
+}
+
+void Workspace::restoreLayout(QMainWindow& window) const {
+    if (!layout.isEmpty())
+        window.restoreState(layout);
 }
 
 } // namespace kota::hub

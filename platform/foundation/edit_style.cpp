@@ -1,5 +1,7 @@
 #include "platform/foundation/edit_style.h"
 
+#include "platform/framework/platform_texts.h"
+
 #include <cstddef>
 
 CKhEditStyle& CKhEditStyle::SetUomUnitBaseGroup(int item) {
@@ -40,7 +42,7 @@ std::string_view CKhEditStyle::print(double value, int direction, kota::NumberBu
 CString CKhEditStyle::GetUomToolTipText() const {
     if (!unit_ || unit_->symbol == kota::dimensionless)
         return {};
-    return "Unit: " + CString(unit_->symbol);
+    return kota::platformText(kota::PlatformText::UnitOf, unit_->symbol.data());
 }
 
 int CKhEditStyle::GetUomItemId() const {

@@ -29,6 +29,7 @@ constexpr StringResource english[] = {
     {id(PlatformText::SomethingNotFile), "%s is not a file"},
     {id(PlatformText::TooLarge), "larger than 4 GiB"},
     {id(PlatformText::NoMemoryToRead), "%s: not enough memory to read it"},
+    {id(PlatformText::UnitOf), "Unit: %s"},
     {id(PlatformText::NotAPlugIn), "%s is not a plug-in of this program"},
     {id(PlatformText::BuiltForOther), "%s was built for version %d of the platform; this is version %d"},
     {id(PlatformText::DoesNotExport), "%s does not export %s"},

@@ -25,6 +25,8 @@ enum class PlatformText : UINT {
     TooLarge,         // a reason
     NoMemoryToRead,   // path
 
+    UnitOf, // a unit's symbol
+
     NotAPlugIn,    // path
     BuiltForOther, // path, its version, the platform's version
     DoesNotExport, // path, name

@@ -11,6 +11,8 @@
 #include <QMimeData>
 #include <QPushButton>
 
+#include <cmath>
+
 namespace {
 
 using namespace kota::hub;
@@ -39,6 +41,11 @@ protected:
         createDocument();
         clickTabOf(front(), tab);
         clickCell(1, 2);
+    }
+    // Brings the n-th frame to the front.
+    void clickFrame(std::size_t n) {
+        shell.screen.perform([this, n] { kota::input::activate(*frames()[n]); });
+        settle();
     }
     void clickCell(int line, int column) {
         click(*grid().viewport(), grid().visualRect(index(line, column)).center());
@@ -98,7 +105,7 @@ TEST_F(AProject, HasAPlacePickedOnTheMapInserted) {
     EXPECT_NEAR(index(last, 2).data().toString().toDouble(), 250, 2);
     const AD_Dispersion& record = recordOf(document().dispersList, last);
     EXPECT_EQ(record.riverName, "MISSOURI");
-    EXPECT_NEAR(record.chainage, 250, 2);
+    EXPECT_EQ(record.chainage, std::round(map().picked()->chainage)) << "as the pin says";
 }
 
 TEST_F(AProject, OffersNoPlaceBehindEscape) {
@@ -131,6 +138,66 @@ TEST_F(AProject, IsToldWhereTheUserIs) {
     const QImage with = map().grab().toImage();
     shell.panels->map().showPlace({});
     EXPECT_NE(map().grab().toImage(), with) << "the mark was there";
+}
+
+TEST_F(AProject, StaysThatOfADocumentThatGetsAnotherWindow) {
+    createDocument();
+    openProject();
+    choose("Window", "New Window");
+    EXPECT_EQ(document().projectHandle, 0) << "it was outside";
+    createDocument();
+    const auto handle = document().projectHandle;
+    open(folder.write("other.geojson", twoRivers));
+
+    choose("Window", "New Window");
+
+    EXPECT_EQ(document().projectHandle, handle);
+    EXPECT_NE(handle, shell.frame.projects().current());
+    choose("File", "Close");
+    EXPECT_EQ(shell.frame.projects().network(handle), nullptr) << "its last document has gone";
+    EXPECT_TRUE(shell.frame.projects().isOpen());
+}
+
+TEST_F(AProject, OffersNoPlaceToADocumentOfAnother) {
+    openProject();
+    createOn("Dispersion");
+    open(folder.write("other.geojson", twoRivers));
+    click(map(), pixel(250, 0));
+    clickCell(1, 3);
+
+    press(Qt::Key_Insert);
+
+    EXPECT_EQ(textAt(grid().model()->rowCount(), 1), "");
+}
+
+TEST_F(AProject, OffersNoPlaceOnAHiddenMap) {
+    openProject();
+    click(map(), pixel(250, 0));
+    ASSERT_TRUE(shell.frame.exchange().offered());
+
+    choose("View", "River Map");
+
+    EXPECT_FALSE(shell.frame.exchange().offered());
+}
+
+TEST_F(AProject, KeepsTheMarkWhenAnotherWindowGoes) {
+    openProject();
+    createOn("Dispersion");
+    click(map(), pixel(250, 0));
+    clickCell(1, 3);
+    press(Qt::Key_Insert);
+    const int last = grid().model()->rowCount();
+    clickCell(1, 4);
+    clickCell(last, 3);
+    ASSERT_TRUE(shell.frame.exchange().current());
+    createDocument();
+
+    choose("File", "Close");
+
+    EXPECT_TRUE(shell.frame.exchange().current());
+    answer(QMessageBox::No);
+    choose("File", "Close");
+    EXPECT_FALSE(shell.frame.exchange().current());
 }
 
 TEST_F(AProject, IsNotToldOfADocumentOutsideIt) {
@@ -234,10 +301,14 @@ TEST_F(APanel, KeepsKeysFromTheDocument) {
     const int lines = grid().model()->rowCount();
     map().setFocus();
 
+    QGuiApplication::clipboard()->setText("ABC");
     press(Qt::Key_Insert);
     type("x");
+    press(Qt::Key_F2);
+    press(Qt::Key_V, Qt::ControlModifier);
 
     EXPECT_EQ(grid().model()->rowCount(), lines);
+    EXPECT_EQ(grid().findChild<QLineEdit*>(), nullptr);
     EXPECT_FALSE(document().IsModified());
 }
 
@@ -347,29 +418,72 @@ TEST_F(TheWorkspace, KeepsTheSizeOfTheWindowAndItsPanels) {
     shell.window->resize(1100, 700);
     choose("View", "Exchange");
 
-    EXPECT_TRUE(workspace.restore(*shell.window));
+    EXPECT_TRUE(workspace.restoreGeometry(*shell.window));
+    workspace.restoreLayout(*shell.window);
     settle();
 
     EXPECT_EQ(shell.window->size(), QSize(900, 650));
     EXPECT_TRUE(shell.panels->exchange().isVisible());
-    EXPECT_FALSE(Workspace().restore(*shell.window));
+    EXPECT_FALSE(Workspace().restoreGeometry(*shell.window));
 }
 
-TEST_F(TheWorkspace, IsAskedForWhileAllIsStillOpen) {
+TEST_F(TheWorkspace, IsNotedWhenAllQuestionsAreAnswered) {
     openProject();
-    const std::string path = copyExample();
-    open(path);
+    open(copyExample("first.AD31"));
+    open(folder.write("river.ad31", "target KOTA0_AD {\n}\n"));
+    document().SetModifiedFlag(TRUE);
     QStringList documents;
     QString project;
     shell.frame.onEnd = [&] {
         documents = shell.frame.documents();
         project = shell.frame.projects().path();
     };
+    answer(QMessageBox::Cancel);
+    choose("File", "Exit");
+    EXPECT_TRUE(documents.isEmpty()) << "the program goes on";
+    answer(QMessageBox::Yes);
 
     choose("File", "Exit");
 
-    EXPECT_EQ(documents, QStringList{QString::fromStdString(path)});
+    EXPECT_EQ(documents, (QStringList{QString::fromStdString(folder.file("first.AD31")),
+                                      QString::fromStdString(folder.file("river.AD31"))}))
+        << "under the names that were written";
     EXPECT_TRUE(project.endsWith("two.geojson"));
+}
+
+TEST_F(TheWorkspace, IsResumedWithTheDocumentThatWasInFront) {
+    const QString first = QString::fromStdString(copyExample("first.AD31"));
+    const QString second = QString::fromStdString(copyExample("second.AD31"));
+    open(QStringList{first, second});
+    clickFrame(0);
+    EXPECT_EQ(shell.frame.documents(), (QStringList{second, first}));
+    const Workspace workspace{QString::fromStdString(network()), {second, first}, {}, {}};
+    choose("File", "Close");
+    choose("File", "Close");
+
+    shell.screen.perform([&] { shell.frame.resume(workspace, {}); });
+    settle();
+
+    EXPECT_EQ(frontTitle(), "first.AD31");
+    EXPECT_EQ(frames().size(), 2U);
+    EXPECT_TRUE(shell.frame.projects().isOpen());
+}
+
+TEST_F(TheWorkspace, GivesWayToWhatIsAskedFor) {
+    const std::string other = folder.write("other.geojson", twoRivers);
+    const Workspace workspace{
+        QString::fromStdString(network()), {QString::fromStdString(copyExample("old.AD31"))}, {}, {}};
+
+    shell.screen.perform([&] {
+        shell.frame.resume(workspace,
+                           {QString::fromStdString(other), QString::fromStdString(copyExample("new.AD31"))});
+    });
+    settle();
+
+    EXPECT_TRUE(shell.frame.projects().path().endsWith("other.geojson"));
+    EXPECT_EQ(shell.frame.projects().current(), 1) << "the last one was not opened before";
+    EXPECT_EQ(frontTitle(), "new.AD31");
+    EXPECT_EQ(frames().size(), 1U);
 }
 
 } // namespace

@@ -44,11 +44,23 @@ TEST(ANetwork, InterpolatesAPlace) {
 
 TEST(ANetwork, HasNoPlaceBeyondARiver) {
     const Network network({bend()});
-    EXPECT_EQ(network.place("BEND", 99.999), std::nullopt);
-    EXPECT_EQ(network.place("BEND", 1500.001), std::nullopt);
+    EXPECT_EQ(network.place("BEND", 99.99), std::nullopt);
+    EXPECT_EQ(network.place("BEND", 1500.01), std::nullopt);
     EXPECT_EQ(network.place("BEND", std::numeric_limits<double>::quiet_NaN()), std::nullopt);
     EXPECT_EQ(network.place("OTHER", 200), std::nullopt);
     EXPECT_EQ(Network().place("BEND", 200), std::nullopt);
+}
+
+TEST(ANetwork, TakesItsEndsForReachedWithinAMillimetre) {
+    const Network network({bend()});
+    EXPECT_EQ(network.place("BEND", 99.9995), network.place("BEND", 100));
+    EXPECT_EQ(network.place("BEND", 1500.0000001), network.place("BEND", 1500));
+}
+
+TEST(ANetwork, KnowsARiverInCapitalsAndInSmallLetters) {
+    const Network network({bend()});
+    EXPECT_EQ(network.place("bend", 700), network.place("BEND", 700));
+    EXPECT_NE(network.place("bend", 700), std::nullopt);
 }
 
 TEST(ANetwork, FindsAPlaceWhereChainagesFall) {
