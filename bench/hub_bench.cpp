@@ -19,6 +19,7 @@ namespace {
 
 constexpr int lines = 100'000;
 constexpr int columns = 5;
+constexpr int decayTab = 4; // its place, from 0
 constexpr QSize windowSize(1280, 800);
 
 using kota::hub::Robot;
@@ -111,7 +112,7 @@ Shell& shellWithLargeDocument() {
     auto& shell = *new Shell;
     shell.open(path);
     Robot robot(*shell.window);
-    robot.clickTab("Decay");
+    robot.clickTab(decayTab);
     robot.clickCell(1, 2);
     return shell;
 }
@@ -123,7 +124,7 @@ std::function<void()> openLarge() {
     paint(*shell.window);
     return [&shell, path] {
         shell.open(path);
-        Robot(*shell.window).clickTab("Decay");
+        Robot(*shell.window).clickTab(decayTab);
         paint(*shell.window);
     };
 }
