@@ -44,7 +44,8 @@ SettingsDialog::SettingsDialog(const Settings& settings, QWidget* parent)
     auto* const languages = new QFormLayout;
     languages->addRow(hubText(HubText::Language), language_);
     auto* const group = new QGroupBox(hubText(HubText::DisplayUnits));
-    auto* const form = new QFormLayout(group);
+    auto* const form = new QFormLayout;
+    group->setLayout(form);
     for (const auto& [item, name] : items) {
         const auto chosen = settings.units.find(item);
         units_[item] = unitChoice(item, chosen == settings.units.end() ? QString() : chosen->second);
