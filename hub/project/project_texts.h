@@ -45,6 +45,11 @@ enum class ProjectText {
     Count_
 };
 
+// Its number in the string tables.
+constexpr UINT idOf(ProjectText text) {
+    return static_cast<UINT>(text);
+}
+
 // In the user's language once that is loaded, in English before.
 QString projectText(ProjectText text);
 // Takes the texts of the user's language. Called once, before anything is shown.

@@ -53,14 +53,16 @@ Projects::Handle Exchange::join(const CView* window) {
     const CDocument* const document = window ? window->GetDocument() : nullptr;
     if (!document)
         return projects_.join();
-    const bool isFirst = document->Views().size() <= 1;
-    if (isFirst)
-        members_[document] = {projects_.join(), 0};
-    const auto member = members_.find(document);
-    if (member == members_.end() || member->second.project == 0) {
-        members_.erase(document);
-        return 0;
+    if (document->Views().size() <= 1) { // its first window
+        members_.erase(document);        // of another document that was there before
+        const Projects::Handle project = projects_.join();
+        if (project != 0)
+            members_[document] = {project, 1};
+        return project;
     }
+    const auto member = members_.find(document);
+    if (member == members_.end())
+        return 0;
     ++member->second.windows;
     return member->second.project;
 }

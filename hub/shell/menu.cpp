@@ -39,7 +39,7 @@ const AcceleratorTable& hubKeys() {
 }
 
 QString hubText(HubText id) {
-    return toQt(hubModule().string(static_cast<UINT>(id)));
+    return toQt(hubModule().string(idOf(id)));
 }
 
 } // namespace kota::hub

@@ -57,6 +57,11 @@ enum class HubText : UINT {
     AtNextStart,
 };
 
+// Its number in the string tables.
+constexpr UINT idOf(HubText text) {
+    return static_cast<UINT>(text);
+}
+
 // Strings, prompts and menu, by language.
 const Resources& englishTexts();
 const Resources& japaneseTexts();

@@ -61,6 +61,11 @@ enum class PlatformText : UINT {
     Count // none of them
 };
 
+// Its number in the string tables.
+constexpr UINT idOf(PlatformText text) {
+    return static_cast<UINT>(text);
+}
+
 // The text in the user's language, in English where there is none, filled in with its arguments.
 KOTA_API CString platformText(PlatformText id, ...);
 

@@ -50,6 +50,16 @@ protected:
     void clickCell(int line, int column) {
         click(*grid().viewport(), grid().visualRect(index(line, column)).center());
     }
+    int lastLine() const { return grid().model()->rowCount(); }
+    // A dispersion line at a place picked on the map, with the cursor in the line above it.
+    void insertPickedLine() {
+        openProject();
+        createOn("Dispersion");
+        click(map(), pixel(250, 0));
+        clickCell(1, 3);
+        press(Qt::Key_Insert);
+        clickCell(1, 4);
+    }
     std::string textAt(int line, int column) const {
         return index(line, column).data().toString().toStdString();
     }
@@ -100,7 +110,7 @@ TEST_F(AProject, HasAPlacePickedOnTheMapInserted) {
 
     press(Qt::Key_Insert);
 
-    const int last = grid().model()->rowCount();
+    const int last = lastLine();
     EXPECT_EQ(textAt(last, 1), "MISSOURI");
     EXPECT_NEAR(index(last, 2).data().toString().toDouble(), 250, 2);
     const AD_Dispersion& record = recordOf(document().dispersList, last);
@@ -119,19 +129,13 @@ TEST_F(AProject, OffersNoPlaceBehindEscape) {
     press(Qt::Key_Insert);
 
     EXPECT_FALSE(shell.frame.exchange().offered());
-    EXPECT_EQ(textAt(grid().model()->rowCount(), 1), "");
+    EXPECT_EQ(textAt(lastLine(), 1), "");
 }
 
 TEST_F(AProject, IsToldWhereTheUserIs) {
-    openProject();
-    createOn("Dispersion");
-    click(map(), pixel(250, 0));
-    clickCell(1, 3);
-    press(Qt::Key_Insert);
-    const int last = grid().model()->rowCount();
-    clickCell(1, 4);
+    insertPickedLine();
 
-    clickCell(last, 3);
+    clickCell(lastLine(), 3);
 
     ASSERT_TRUE(shell.frame.exchange().current());
     EXPECT_EQ(shell.frame.exchange().current()->river, "MISSOURI");
@@ -167,7 +171,7 @@ TEST_F(AProject, OffersNoPlaceToADocumentOfAnother) {
 
     press(Qt::Key_Insert);
 
-    EXPECT_EQ(textAt(grid().model()->rowCount(), 1), "");
+    EXPECT_EQ(textAt(lastLine(), 1), "");
 }
 
 TEST_F(AProject, OffersNoPlaceOnAHiddenMap) {
@@ -181,14 +185,8 @@ TEST_F(AProject, OffersNoPlaceOnAHiddenMap) {
 }
 
 TEST_F(AProject, KeepsTheMarkWhenAnotherWindowGoes) {
-    openProject();
-    createOn("Dispersion");
-    click(map(), pixel(250, 0));
-    clickCell(1, 3);
-    press(Qt::Key_Insert);
-    const int last = grid().model()->rowCount();
-    clickCell(1, 4);
-    clickCell(last, 3);
+    insertPickedLine();
+    clickCell(lastLine(), 3);
     ASSERT_TRUE(shell.frame.exchange().current());
     createDocument();
 
@@ -298,7 +296,7 @@ TEST_F(APanel, LeavesTheKeyboardToTheDocumentByEscape) {
 TEST_F(APanel, KeepsKeysFromTheDocument) {
     openProject();
     createOn("Dispersion");
-    const int lines = grid().model()->rowCount();
+    const int lines = lastLine();
     map().setFocus();
 
     QGuiApplication::clipboard()->setText("ABC");
@@ -307,7 +305,7 @@ TEST_F(APanel, KeepsKeysFromTheDocument) {
     press(Qt::Key_F2);
     press(Qt::Key_V, Qt::ControlModifier);
 
-    EXPECT_EQ(grid().model()->rowCount(), lines);
+    EXPECT_EQ(lastLine(), lines);
     EXPECT_EQ(grid().findChild<QLineEdit*>(), nullptr);
     EXPECT_FALSE(document().IsModified());
 }

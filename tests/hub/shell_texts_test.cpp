@@ -18,7 +18,7 @@ TEST(TheShellsJapaneseTexts, StandForEachStringOfAProject) {
     using kota::hub::ProjectText;
     std::vector<UINT> same;
     for (const ProjectText text : {ProjectText::Within, ProjectText::Place, ProjectText::Metres})
-        same.push_back(static_cast<UINT>(text));
+        same.push_back(idOf(text));
     expectTranslated(*japanese, kota::hub::englishProjectTexts(), same);
 }
 
